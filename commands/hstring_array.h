@@ -1,0 +1,13 @@
+// The growable array of strings in which strTokArray collects its tokens.
+#pragma once
+
+#include "../host/hstring.h"
+#include "../host/tarray.h"
+
+class HStringArray : public TArray<HString> {
+ public:
+  static constexpr int kGrowStep = 8;
+
+  HStringArray();
+  ~HStringArray() override;
+};

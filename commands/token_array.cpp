@@ -1,0 +1,83 @@
+#include "token_array.h"
+
+#include "command_frame.h"
+#include "hstring_array.h"
+#include "token_scan.h"
+
+namespace {
+
+// Character-set mode: runs of delimiters anywhere separate once, so no
+// element is empty and none holds a delimiter character.
+void splitByCharSet(const HString& text, const HString& delims, HStringArray& tokens) {
+  const DelimiterSet set(delims);
+  for (int start = 0; start < text.GetLength();) {
+    const TokenSpan span = scanCharSetToken(text, start, set);
+    if (span.end > start) tokens.add(text.Mid(start, span.end - start));
+    start = span.next;
+  }
+}
+
+// Match-all mode: every occurrence ends one element, empty ones included;
+// nothing follows an occurrence that ends the text.
+void splitByDelimiterString(const HString& text, const HString& delims, HStringArray& tokens) {
+  int start = 0;
+  for (TokenSpan span; (span = scanMatchAllToken(text, start, delims)).delimited;
+       start = span.next) {
+    tokens.add(text.Mid(start, span.end - start));
+  }
+  if (start < text.GetLength()) tokens.add(text.Mid(start));
+}
+
+}  // namespace
+
+StrTokArrayCmd::StrTokArrayCmd() : Command("strTokArray", "Get HString Token Array", "") {
+  setCategory(*this, kStringCategory);
+  declareStringOption(*this, "delims");
+  declareFlagOption(*this, "matchAll");
+}
+
+StrTokArrayCmd::~StrTokArrayCmd() = default;
+
+void StrTokArrayCmd::deleteThis() {
+  releaseCommand(*this);
+}
+
+const HRuntimeClass* StrTokArrayCmd::getRuntimeClass() const {
+  return commandRuntimeClass();
+}
+
+bool StrTokArrayCmd::execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
+                             Variable& result) {
+  const HString text(args[0].getStringValue(-1));
+  TokenOptions tokenOptions;
+  if (!readTokenOptions(options, tokenOptions)) return false;
+
+  HStringArray tokens;
+  if (tokenOptions.matchAll) {
+    splitByDelimiterString(text, tokenOptions.delims, tokens);
+  } else {
+    splitByCharSet(text, tokenOptions.delims, tokens);
+  }
+  if (tokens.count() == 0) {
+    Command::logWarning("Couldn't find any string tokens");
+    return true;
+  }
+
+  Variable value(Variable::TypeStringArray, tokens.count());
+  for (int i = 0; i < tokens.count(); ++i) value.setValue(tokens[i].GetStr(), i);
+  result = value;
+  return true;
+}
+
+void StrTokArrayCmd::getArgSyntaxString(HString& syntax) const {
+  syntax = "\"string\"";
+}
+
+bool StrTokArrayCmd::checkArgSyntax(const TArray<Variable>& args,
+                                    const TArray<CommandOption>& /*options*/) const {
+  return argumentsAre(args, {Variable::TypeString});
+}
+
+Variable::VarType StrTokArrayCmd::getReturnType() const {
+  return Variable::TypeStringArray;
+}

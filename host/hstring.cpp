@@ -1,0 +1,247 @@
+#include "hstring.h"
+
+#include "format_text.h"
+
+#include <climits>
+#include <cstdarg>
+#include <cstdio>
+#include <cstring>
+#include <new>
+#include <string>
+#include <vector>
+
+namespace {
+
+const char kEmptyText[] = "";
+
+size_t textLength(const char* text) {
+  return text == nullptr ? 0 : std::strlen(text);
+}
+
+// Finds one needle in texts in time linear in text and needle
+// (Knuth-Morris-Pratt); single bytes go straight to memchr.
+class Searcher {
+ public:
+  Searcher(const char* needle, size_t length) : m_needle(needle), m_length(length) {
+    if (m_length < 2) return;
+    m_border.assign(m_length, 0);
+    size_t k = 0;
+    for (size_t i = 1; i < m_length; ++i) {
+      while (k > 0 && m_needle[i] != m_needle[k]) k = m_border[k - 1];
+      if (m_needle[i] == m_needle[k]) ++k;
+      m_border[i] = k;
+    }
+  }
+
+  // First match at or after from, or npos. from must be <= textLength.
+  size_t find(const char* text, size_t textLength, size_t from) const {
+    if (m_length == 0) return from;
+    if (m_length > textLength - from) return npos;
+    if (m_length == 1) {
+      const void* hit = std::memchr(text + from, m_needle[0], textLength - from);
+      return hit == nullptr ? npos : static_cast<size_t>(static_cast<const char*>(hit) - text);
+    }
+    size_t matched = 0;
+    for (size_t i = from; i < textLength; ++i) {
+      while (matched > 0 && text[i] != m_needle[matched]) matched = m_border[matched - 1];
+      if (text[i] == m_needle[matched]) ++matched;
+      if (matched == m_length) return i + 1 - m_length;
+    }
+    return npos;
+  }
+
+  static constexpr size_t npos = static_cast<size_t>(-1);
+
+ private:
+  const char* m_needle;
+  size_t m_length;
+  std::vector<size_t> m_border;
+};
+
+int foldAscii(unsigned char c) {
+  return (c >= 'A' && c <= 'Z') ? c - 'A' + 'a' : c;
+}
+
+template <class Fold>
+int compareTexts(const char* left, const char* right, Fold fold) {
+  const auto* a = reinterpret_cast<const unsigned char*>(left);
+  const auto* b = reinterpret_cast<const unsigned char*>(right == nullptr ? kEmptyText : right);
+  for (;; ++a, ++b) {
+    const int difference = fold(*a) - fold(*b);
+    if (difference != 0 || *a == 0) return difference;
+  }
+}
+
+}  // namespace
+
+HString::HString() : m_data(nullptr), m_length(0), m_capacity(0) {}
+
+HString::HString(const char* text) : HString() {
+  assign(text, textLength(text));
+}
+
+HString::HString(const HString& other) : HString() {
+  assign(other.GetStr(), static_cast<size_t>(other.m_length));
+}
+
+HString::~HString() {
+  delete[] m_data;
+}
+
+void HString::assign(const char* text, size_t length) {
+  if (length > static_cast<size_t>(INT_MAX) - 1) throw std::bad_alloc();
+  char* copy = nullptr;
+  if (length > 0) {
+    copy = new char[length + 1];
+    std::memcpy(copy, text, length);
+    copy[length] = '\0';
+  }
+  delete[] m_data;
+  m_data = copy;
+  m_length = static_cast<int>(length);
+  m_capacity = m_length;
+}
+
+HString& HString::operator=(const char* text) {
+  if (text != m_data) assign(text, textLength(text));
+  return *this;
+}
+
+HString& HString::operator=(const HString& other) {
+  if (this != &other) assign(other.GetStr(), static_cast<size_t>(other.m_length));
+  return *this;
+}
+
+HString::operator const char*() const {
+  return GetStr();
+}
+
+const char* HString::GetStr() const {
+  return m_data == nullptr ? kEmptyText : m_data;
+}
+
+int HString::GetLength() const {
+  return m_length;
+}
+
+bool HString::IsEmpty() const {
+  return m_length == 0;
+}
+
+void HString::Empty() {
+  delete[] m_data;
+  m_data = nullptr;
+  m_length = 0;
+  m_capacity = 0;
+}
+
+char HString::operator[](int index) const {
+  return (index >= 0 && index < m_length) ? m_data[index] : '\0';
+}
+
+char& HString::operator[](int index) {
+  if (index >= 0 && index < m_length) return m_data[index];
+  thread_local char scratch;
+  scratch = '\0';
+  return scratch;
+}
+
+HString& HString::operator+=(char c) {
+  if (c == '\0') return *this;
+  if (m_length == m_capacity) {
+    // Doubling keeps a run of appends linear in the final length.
+    if (m_length >= INT_MAX - 1) throw std::bad_alloc();
+    const int capacity =
+        m_capacity < 8 ? 8 : (m_capacity > INT_MAX / 2 - 1 ? INT_MAX - 1 : m_capacity * 2);
+    char* grown = new char[static_cast<size_t>(capacity) + 1];
+    std::memcpy(grown, GetStr(), static_cast<size_t>(m_length));
+    delete[] m_data;
+    m_data = grown;
+    m_capacity = capacity;
+  }
+  m_data[m_length++] = c;
+  m_data[m_length] = '\0';
+  return *this;
+}
+
+int HString::Compare(const char* other) const {
+  return compareTexts(GetStr(), other, [](unsigned char c) { return static_cast<int>(c); });
+}
+
+int HString::CompareNoCase(const char* other) const {
+  return compareTexts(GetStr(), other, foldAscii);
+}
+
+int HString::Find(const char* sub) const {
+  return Find(sub, 0);
+}
+
+int HString::Find(const char* sub, int start) const {
+  if (start < 0) start = 0;
+  if (start > m_length) return -1;
+  const char* needle = sub == nullptr ? kEmptyText : sub;
+  const Searcher searcher(needle, std::strlen(needle));
+  const size_t hit =
+      searcher.find(GetStr(), static_cast<size_t>(m_length), static_cast<size_t>(start));
+  return hit == Searcher::npos ? -1 : static_cast<int>(hit);
+}
+
+int HString::ReverseFind(char c) const {
+  for (int i = m_length - 1; i >= 0; --i) {
+    if (m_data[i] == c) return i;
+  }
+  return -1;
+}
+
+HString HString::Left(size_t count) const {
+  return Mid(0, count);
+}
+
+HString HString::Right(size_t count) const {
+  const size_t length = static_cast<size_t>(m_length);
+  return Mid(count >= length ? 0 : length - count);
+}
+
+HString HString::Mid(size_t first) const {
+  return Mid(first, static_cast<size_t>(m_length));
+}
+
+HString HString::Mid(size_t first, size_t count) const {
+  HString part;
+  const size_t length = static_cast<size_t>(m_length);
+  if (first >= length) return part;
+  const size_t available = length - first;
+  part.assign(m_data + first, count < available ? count : available);
+  return part;
+}
+
+int HString::Replace(const char* oldText, const char* newText) {
+  const size_t oldLength = textLength(oldText);
+  if (oldLength == 0) return 0;
+  const char* replacement = newText == nullptr ? kEmptyText : newText;
+  const size_t newLength = std::strlen(replacement);
+  const Searcher searcher(oldText, oldLength);
+  const char* text = GetStr();
+  const size_t length = static_cast<size_t>(m_length);
+
+  std::string result;
+  int replaced = 0;
+  size_t from = 0;
+  for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
+       from = hit + oldLength) {
+    result.append(text + from, hit - from).append(replacement, newLength);
+    ++replaced;
+  }
+  if (replaced == 0) return 0;
+  result.append(text + from, length - from);
+  assign(result.data(), result.size());
+  return replaced;
+}
+
+void HString::Format(const char* format, ...) {
+  va_list arguments;
+  va_start(arguments, format);
+  const std::string text = formatText(format, arguments);
+  va_end(arguments);
+  assign(text.c_str(), std::strlen(text.c_str()));  // a %c of NUL ends the text
+}

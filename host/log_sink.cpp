@@ -1,0 +1,36 @@
+#include "log_sink.h"
+
+#include <cstdio>
+
+namespace {
+
+LogSinkFn g_sink = nullptr;
+void* g_sinkContext = nullptr;
+
+}  // namespace
+
+void setLogSink(LogSinkFn sink, void* context) {
+  g_sink = sink;
+  g_sinkContext = context;
+}
+
+const char* logLevelName(LogLevel level) {
+  switch (level) {
+    case LogError:
+      return "error";
+    case LogWarning:
+      return "warning";
+    case LogInfo:
+      return "info";
+  }
+  return "log";
+}
+
+void logMessage(LogLevel level, const char* message) {
+  const char* text = message == nullptr ? "" : message;
+  if (g_sink != nullptr) {
+    g_sink(level, text, g_sinkContext);
+    return;
+  }
+  std::fprintf(stderr, "%s: %s\n", logLevelName(level), text);
+}

@@ -1,0 +1,7 @@
+#include "tarray.h"
+
+#include <new>
+
+void tarrayCapacityExhausted() {
+  throw std::bad_alloc();
+}

@@ -1,0 +1,78 @@
+// The host's growable array: a count and contiguous elements. Arguments reach
+// a command as TArray<Variable>, given options as TArray<CommandOption>.
+#pragma once
+
+#include "core_export.h"
+
+// Raises the standard allocation exception when an array cannot grow further.
+[[noreturn]] TAVIXCORE_API void tarrayCapacityExhausted();
+
+template <class T>
+class TArray {
+ public:
+  explicit TArray(int growStep = 8)
+      : m_flags(0), m_count(0), m_capacity(0), m_growStep(growStep), m_buffer(nullptr) {}
+  TArray(const TArray&) = delete;
+  TArray& operator=(const TArray&) = delete;
+
+  // Destroys every slot of the buffer (elements and spare slots alike).
+  virtual ~TArray() { delete[] m_buffer; }
+
+  // Removes up to n elements from index on and closes the gap. Arguments
+  // outside the array are clamped to what exists: an index outside
+  // 0..count-1 or an n below 1 removes nothing, and elements before index
+  // are never touched.
+  virtual void removeAt(int index, int n) {
+    if (index < 0 || index >= m_count || n <= 0) return;
+    const int removed = n < m_count - index ? n : m_count - index;
+    for (int i = index; i < m_count - removed; ++i) m_buffer[i] = m_buffer[i + removed];
+    m_count -= removed;
+  }
+
+  // Forgets every element; the buffer and its strings stay for reuse.
+  virtual void removeAll() { m_count = 0; }
+
+  // Appends a copy of value. Growth adds the grow step to an empty array and
+  // at least doubles after that, so n appends copy O(n) elements in all. When
+  // growing fails, the array keeps its elements and buffer.
+  void add(T value) {
+    if (m_count >= m_capacity) grow();
+    m_buffer[m_count] = value;
+    ++m_count;
+  }
+
+  int count() const { return m_count; }
+  int capacity() const { return m_capacity; }
+  int growStep() const { return m_growStep; }
+
+  // Elements 0..count-1; callers check the index against count().
+  const T& operator[](int index) const { return m_buffer[index]; }
+  T& operator[](int index) { return m_buffer[index]; }
+
+ private:
+  void grow() {
+    const long long step = m_growStep > 0 ? m_growStep : 1;
+    long long capacity = m_capacity + step;
+    if (capacity < 2LL * m_capacity) capacity = 2LL * m_capacity;
+    const long long limit = 0x7fffffff;
+    if (capacity > limit) capacity = limit;
+    if (capacity <= m_count) tarrayCapacityExhausted();
+    T* buffer = new T[static_cast<unsigned long long>(capacity)];
+    try {
+      for (int i = 0; i < m_count; ++i) buffer[i] = m_buffer[i];
+    } catch (...) {
+      delete[] buffer;
+      throw;
+    }
+    delete[] m_buffer;
+    m_buffer = buffer;
+    m_capacity = static_cast<int>(capacity);
+  }
+
+ protected:
+  unsigned char m_flags;  // 0; kept for the host's layout, never read
+  int m_count;
+  int m_capacity;
+  int m_growStep;
+  T* m_buffer;
+};

@@ -1,0 +1,44 @@
+// A typed script value: nothing, an integer, a string or an array of strings.
+// Index -1 names the plain value, 0..count-1 an element of an array.
+#pragma once
+
+#include "core_export.h"
+
+class TAVIXCORE_API Variable {
+ public:
+  enum VarType { TypeNone = 0, TypeInt = 1, TypeString = 3, TypeStringArray = 19 };
+
+  // An array (TypeStringArray) starts with count empty strings; other types
+  // ignore count. Any other type code gives TypeNone.
+  Variable(VarType type = TypeNone, int count = 0);  // NOLINT(google-explicit-constructor)
+  Variable(const Variable& other);
+  virtual ~Variable();
+  virtual VarType getType() const;
+
+  // The plain text of a string, or an element's text of an array. Anything
+  // else (other types, indexes out of range) reads as the empty text. The
+  // pointer stays valid while the value is unchanged.
+  const char* getStringValue(int index) const;
+  // The plain integer; anything else reads as 0.
+  int getIntValue(int index) const;
+  // Elements of an array: 0 when the value is no array.
+  int getCount() const;
+
+  // Index -1 makes the value an integer, or a string (null counts as empty).
+  // An index 0..count-1 of an array sets that element's text; an integer
+  // cannot be stored in an array, and other indexes write nothing.
+  void setValue(int value, int index);
+  void setValue(const char* value, int index);
+
+  Variable& operator=(const Variable& other);
+
+ private:
+  void clear();
+  void copyFrom(const Variable& other);
+
+  VarType m_type;
+  int m_int;
+  char* m_text;
+  char** m_elements;
+  int m_count;
+};

@@ -1,0 +1,28 @@
+// The functions the host finds by name when it loads the module.
+#include "../host/plugin_exports.h"
+#include "plugin_export.h"
+#include "string_commands_plugin.h"
+
+extern "C" {
+
+TAVIX_PLUGIN_EXPORT int apiVersion() {
+  return kPluginApiVersion;
+}
+
+TAVIX_PLUGIN_EXPORT bool isDebug() {
+  return false;
+}
+
+TAVIX_PLUGIN_EXPORT int getNumPlugins() {
+  return 1;
+}
+
+TAVIX_PLUGIN_EXPORT CommandPluginBase* getPlugin(int index) {
+  return index == 0 ? TavixStringCommandsPlugin::createInstance() : nullptr;
+}
+
+TAVIX_PLUGIN_EXPORT bool isRuvan() {
+  return false;
+}
+
+}  // extern "C"
