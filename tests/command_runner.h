@@ -9,28 +9,8 @@
 #include <vector>
 
 #include "../host/command.h"
-#include "../host/log_sink.h"
+#include "../tools/log_capture.h"
 #include "../tools/plugin_session.h"
-
-struct LogEntry {
-  LogLevel level;
-  std::string message;
-  bool operator==(const LogEntry& other) const {
-    return level == other.level && message == other.message;
-  }
-};
-
-// Catches every message logged while it lives.
-class LogCapture {
- public:
-  LogCapture();
-  ~LogCapture();
-  const std::vector<LogEntry>& entries() const { return m_entries; }
-
- private:
-  static void receive(LogLevel level, const char* message, void* context);
-  std::vector<LogEntry> m_entries;
-};
 
 Variable str(const char* text);
 Variable num(int value);

@@ -1,0 +1,125 @@
+// tavix-host end to end: its line syntax, output, refusals and exit status.
+#include <gtest/gtest.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <fstream>
+#include <sstream>
+#include <string>
+
+#if !defined(_WIN32)
+#include <sys/wait.h>
+#endif
+
+namespace {
+
+struct HostRun {
+  int status;
+  std::string out;
+  std::string err;
+};
+
+std::string readFile(const std::string& path) {
+  std::ifstream in(path, std::ios::binary);
+  std::ostringstream text;
+  text << in.rdbuf();
+  return text.str();
+}
+
+std::string quoteArg(const std::string& arg) {
+  return "\"" + arg + "\"";
+}
+
+// Runs tavix-host with the given (already quoted) arguments and standard input.
+HostRun runHost(const std::string& args, const std::string& input = "") {
+  const std::string base = ::testing::TempDir() + "console_test_";
+  std::ofstream(base + "in", std::ios::binary) << input;
+  const std::string commandLine = quoteArg(TAVIX_HOST_PATH) + " " + args + " < " +
+                                  quoteArg(base + "in") + " > " + quoteArg(base + "out") + " 2> " +
+                                  quoteArg(base + "err");
+  int status = std::system(commandLine.c_str());
+#if !defined(_WIN32)
+  status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+#endif
+  return HostRun{status, readFile(base + "out"), readFile(base + "err")};
+}
+
+TEST(ConsoleTest, LineSyntaxReachesTheCommands) {
+  const HostRun run = runHost(
+      "--json -e 'strLeft \"a\\\"b\\\\c\\td\" -2' -e 'strMid abcdef 2 -1' "
+      "-e 'strTokArray -delims \",\" -matchAll \"x,\\x41,\"' -e 'strFind \"-x\" -x 0'");
+  EXPECT_EQ(
+      run.out,
+      "{\"line\": 1, \"command\": \"strLeft\", \"ran\": true, \"ok\": true, \"type\": 3, "
+      "\"value\": \"a\\\"b\\\\c\\u0009d\", \"log\": []}\n"
+      "{\"line\": 2, \"command\": \"strMid\", \"ran\": true, \"ok\": true, \"type\": 3, "
+      "\"value\": \"cdef\", \"log\": []}\n"
+      "{\"line\": 3, \"command\": \"strTokArray\", \"ran\": true, \"ok\": true, \"type\": 19, "
+      "\"value\": [\"x\", \"A\"], \"log\": []}\n"
+      "{\"line\": 4, \"command\": \"strFind\", \"ran\": false, \"ok\": false, \"type\": 0, "
+      "\"value\": null, \"log\": [], \"error\": \"unknown option -x for strFind\"}\n");
+  EXPECT_EQ(run.status, 1) << "a refused line sets the exit status";
+}
+
+TEST(ConsoleTest, EightBitBytesRoundTripThroughJson) {
+  const HostRun run = runHost("--json", "strRight \"\\xe9\\x7f\\x01z\" 99\n");
+  EXPECT_NE(run.out.find("\"value\": \"\\u00e9\\u007f\\u0001z\""), std::string::npos) << run.out;
+}
+
+TEST(ConsoleTest, StrTokWalksAcrossLinesAndMessagesAreShown) {
+  const HostRun run = runHost("",
+                              "# a walk\n\nstrTok -delims ; \"a;b\"\nstrTok -delims ;\nstrTok\n"
+                              "strTokArray \" \"\ntestPrint\n");
+  EXPECT_EQ(run.status, 0);
+  EXPECT_EQ(run.out, "\"a\"\n\"b\"\n\"\"\n");
+  EXPECT_EQ(run.err,
+            "warning: Couldn't find any string tokens\n"
+            "info: Simple call to logInfo\n"
+            "info: Call to logInfo with 2 arguments, woohoo \n"
+            "info: Call to logInfo from HString::Format with 2 arguments, woohoo \n");
+}
+
+TEST(ConsoleTest, RefusalsAreNamedAndTheRunGoesOn) {
+  const HostRun run = runHost("",
+                              "nope 1\nstrLeft \"abc\"\nstrLength \"x\\x00\"\n"
+                              "strReverseFind abc \"\"\nstrLength abc\n");
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.out, "3\n");
+  EXPECT_EQ(run.err,
+            "line 1: unknown command nope\n"
+            "line 2: usage: strLeft \"string\" count\n"
+            "line 3: a string cannot hold a NUL byte\n"
+            "error: Second argument cannot be an empty string\n");
+}
+
+TEST(ConsoleTest, LoadAndUsageErrorsExitWithTwo) {
+  const HostRun missing = runHost("--module /nonexistent/TavixStringCmds.hll -e 'strLength a'");
+  EXPECT_EQ(missing.status, 2);
+  EXPECT_EQ(missing.out, "");
+  EXPECT_NE(missing.err.find("cannot load /nonexistent/TavixStringCmds.hll"), std::string::npos);
+  EXPECT_EQ(std::count(missing.err.begin(), missing.err.end(), '\n'), 1);
+
+  const HostRun notAModule = runHost("--module " + quoteArg(TAVIX_HOST_PATH) + " -e 'strLength a'");
+  EXPECT_EQ(notAModule.status, 2);
+  EXPECT_EQ(runHost("--bogus").status, 2);
+  EXPECT_EQ(runHost("-e").status, 2);
+}
+
+TEST(ConsoleTest, ListShowsEveryCommand) {
+  const HostRun run = runHost("--list --json");
+  EXPECT_EQ(run.status, 0);
+  EXPECT_EQ(run.out.rfind("{\"plugin\": {\"maker\": \"Orlem\", \"publisher\": \"Orlem\", ", 0), 0u);
+  EXPECT_NE(run.out.find("\"name\": \"Tavix String Commands\", \"release\": \"2.00\", "
+                         "\"apiVersion\": 524288}"),
+            std::string::npos);
+  EXPECT_NE(run.out.find("{\"position\": 9, \"name\": \"strTokArray\", \"category\": \"String\", "
+                         "\"description\": \"Get HString Token Array\", \"options\": "
+                         "[{\"name\": \"delims\", \"takesValue\": true}, {\"name\": \"matchAll\", "
+                         "\"takesValue\": false}], \"syntax\": \"\\\"string\\\"\", "
+                         "\"returnType\": 19, \"canExecuteSolo\": true}"),
+            std::string::npos)
+      << run.out;
+  EXPECT_NE(run.out.find("\"position\": 10, \"name\": \"testPrint\""), std::string::npos);
+}
+
+}  // namespace
