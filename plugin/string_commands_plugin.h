@@ -31,8 +31,6 @@ class TavixStringCommandsPlugin : public CommandPluginBase {
   // The command at index, or null outside 0..getNumCommands()-1.
   Command* getCommand(int index) override;
 
-  const TSimpleArray<Command*>& commandList() const { return m_commands; }
-
  private:
   TavixStringCommandsPlugin();
   ~TavixStringCommandsPlugin() override;

@@ -6,7 +6,6 @@
 #include <vector>
 
 #include "../host/plugin_exports.h"
-#include "../plugin/string_commands_plugin.h"
 #include "command_runner.h"
 
 namespace {
@@ -89,10 +88,8 @@ TEST_F(PluginTest, IdentityAndHostSlots) {
 
 TEST_F(PluginTest, InitializeCreatesTheElevenCommandsInOrderAndAgainBehind) {
   CommandPluginBase* plugin = getPlugin(0);
-  const auto& list = static_cast<TavixStringCommandsPlugin*>(plugin)->commandList();
   EXPECT_TRUE(plugin->initialize());
   ASSERT_EQ(plugin->getNumCommands(), 11);
-  EXPECT_EQ(list.capacity(), 16);
   std::vector<Command*> firstRound;
   for (int i = 0; i < 11; ++i) {
     firstRound.push_back(plugin->getCommand(i));
@@ -103,7 +100,6 @@ TEST_F(PluginTest, InitializeCreatesTheElevenCommandsInOrderAndAgainBehind) {
 
   EXPECT_TRUE(plugin->initialize());
   ASSERT_EQ(plugin->getNumCommands(), 22);
-  EXPECT_EQ(list.capacity(), 32);
   for (int i = 0; i < 11; ++i) {
     EXPECT_EQ(plugin->getCommand(i), firstRound[static_cast<size_t>(i)]);
     EXPECT_STREQ(plugin->getCommand(i + 11)->getName(), kCommandOrder[i]);
