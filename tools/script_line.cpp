@@ -88,14 +88,14 @@ bool isDecimalInteger(const std::string& word) {
 
 bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, std::string& error) {
   words.clear();
+  if (line.find('\0') != std::string::npos) {
+    error = "a line cannot hold a NUL byte";
+    return false;
+  }
   size_t pos = 0;
   while (true) {
     while (pos < line.size() && isBlank(line[pos])) ++pos;
     if (pos == line.size()) return true;
-    if (line[pos] == '\0') {
-      error = "a line cannot hold a NUL byte";
-      return false;
-    }
     if (line[pos] == '"') {
       ScriptWord word{ScriptWord::String, std::string(), 0};
       if (!readQuoted(line, pos, word.text, error)) return false;
@@ -103,13 +103,7 @@ bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, st
       continue;
     }
     const size_t start = pos;
-    while (pos < line.size() && !isBlank(line[pos])) {
-      if (line[pos] == '\0') {
-        error = "a line cannot hold a NUL byte";
-        return false;
-      }
-      ++pos;
-    }
+    while (pos < line.size() && !isBlank(line[pos])) ++pos;
     const std::string bare = line.substr(start, pos - start);
     if (isDecimalInteger(bare)) {
       errno = 0;
