@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "../tools/log_capture.h"
+#include "../tools/plugin_session.h"
 #include "fuzz_support.h"
 
 namespace {
@@ -110,7 +111,7 @@ void checkTokenArray(const std::string& input, const TArray<CommandOption>& opti
 }
 
 void runOneCall(FuzzedDataProvider& data) {
-  PluginSession& s = fuzzedModule();
+  PluginSession& s = sharedDefaultSession();
   const size_t position = data.ConsumeIntegralInRange<size_t>(0, s.commands().size() - 1);
   Command& command = *s.commands()[position];
   const std::string name = command.getName();

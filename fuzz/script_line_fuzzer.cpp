@@ -9,6 +9,7 @@
 
 #include "../tools/console.h"
 #include "../tools/log_capture.h"
+#include "../tools/plugin_session.h"
 #include "../tools/script_line.h"
 #include "../tools/text_escape.h"
 #include "fuzz_support.h"
@@ -36,7 +37,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, size_t size) {
   std::ostringstream out;
   std::ostringstream err;
   LogCapture quiet;
-  Console console(fuzzedModule(), size % 2 == 0, out, err);
+  Console console(sharedDefaultSession(), size % 2 == 0, out, err);
   console.runLine(1, line);
   return 0;
 }

@@ -1,5 +1,7 @@
 #include "plugin_session.h"
 
+#include <cstdio>
+#include <cstdlib>
 #include <exception>
 
 #include "../host/plugin_exports.h"
@@ -12,6 +14,19 @@ const char kModuleFileName[] = "TavixStringCmds.hll";
 
 std::string defaultModulePath() {
   return executableDirectory() + kModuleFileName;
+}
+
+PluginSession& sharedDefaultSession() {
+  static PluginSession* session = [] {
+    std::string error;
+    PluginSession* opened = PluginSession::open(defaultModulePath(), error).release();
+    if (opened == nullptr) {
+      std::fprintf(stderr, "%s\n", error.c_str());
+      std::exit(2);
+    }
+    return opened;
+  }();
+  return *session;
 }
 
 std::unique_ptr<PluginSession> PluginSession::open(const std::string& path, std::string& error) {

@@ -15,6 +15,12 @@
 // The module file built beside the running executable.
 std::string defaultModulePath();
 
+class PluginSession;
+
+// The module beside the running executable, loaded on first use and kept
+// for the whole run; the program stops with the reason if it cannot load.
+PluginSession& sharedDefaultSession();
+
 class PluginSession {
  public:
   // Loads path, checks apiVersion and getNumPlugins, creates the plug-in and
