@@ -3,14 +3,14 @@
 // point to.
 #pragma once
 
-#include <climits>
-#include <cstdlib>
-#include <cstring>
+#include <limits.h>
+#include <stdlib.h>
+#include <string.h>
 
 // The general heap behind TSimpleArray; tests substitute one that fails.
 struct MallocHeap {
-  static void* allocate(size_t bytes) { return std::malloc(bytes); }
-  static void release(void* block) { std::free(block); }
+  static void* allocate(size_t bytes) { return malloc(bytes); }
+  static void release(void* block) { free(block); }
 };
 
 // Thrown, as a const char*, when the buffer cannot grow.
@@ -50,7 +50,7 @@ class TSimpleArray {
     const int capacity = m_capacity + step;
     T* buffer = static_cast<T*>(Heap::allocate(sizeof(T) * static_cast<size_t>(capacity)));
     if (buffer == nullptr) throw kSimpleArrayOutOfMemory;
-    if (m_count > 0) std::memcpy(buffer, m_buffer, sizeof(T) * static_cast<size_t>(m_count));
+    if (m_count > 0) memcpy(buffer, m_buffer, sizeof(T) * static_cast<size_t>(m_count));
     if (m_buffer != nullptr) Heap::release(m_buffer);
     m_buffer = buffer;
     m_capacity = capacity;

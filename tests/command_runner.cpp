@@ -53,7 +53,7 @@ CommandRun runCommand(Command& command, const std::vector<Variable>& args,
 
 std::unique_ptr<PluginSession> freshModule() {
   std::string error;
-  std::unique_ptr<PluginSession> session = PluginSession::open(TAVIX_MODULE_PATH, error);
+  std::unique_ptr<PluginSession> session = PluginSession::open(defaultModulePath(), error);
   if (!session) ADD_FAILURE() << error;
   return session;
 }

@@ -6,6 +6,9 @@
 #include <fstream>
 #include <sstream>
 #include <string>
+#include <vector>
+
+#include "../tools/module_loader.h"
 
 #if !defined(_WIN32)
 #include <sys/wait.h>
@@ -26,28 +29,44 @@ std::string readFile(const std::string& path) {
   return text.str();
 }
 
+#if defined(_WIN32)
+const char kHostFile[] = "tavix-host.exe";
+#else
+const char kHostFile[] = "tavix-host";
+#endif
+
+std::string hostPath() {
+  return executableDirectory() + kHostFile;
+}
+
+// Arguments are quoted for the shell; they hold no quote or backslash, so
+// the same command line works under sh and cmd. Script lines with quotes go
+// through standard input.
 std::string quoteArg(const std::string& arg) {
   return "\"" + arg + "\"";
 }
 
-// Runs tavix-host with the given (already quoted) arguments and standard input.
-HostRun runHost(const std::string& args, const std::string& input = "") {
+HostRun runHost(const std::vector<std::string>& args, const std::string& input = "") {
   const std::string base = ::testing::TempDir() + "console_test_";
   std::ofstream(base + "in", std::ios::binary) << input;
-  const std::string commandLine = quoteArg(TAVIX_HOST_PATH) + " " + args + " < " +
-                                  quoteArg(base + "in") + " > " + quoteArg(base + "out") + " 2> " +
-                                  quoteArg(base + "err");
-  int status = std::system(commandLine.c_str());
-#if !defined(_WIN32)
-  status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+  std::string commandLine = quoteArg(hostPath());
+  for (const std::string& arg : args) commandLine += " " + quoteArg(arg);
+  commandLine += " < " + quoteArg(base + "in") + " > " + quoteArg(base + "out") + " 2> " +
+                 quoteArg(base + "err");
+#if defined(_WIN32)
+  const int status = std::system(("\"" + commandLine + "\"").c_str());  // cmd strips one pair
+#else
+  const int raw = std::system(commandLine.c_str());
+  const int status = WIFEXITED(raw) ? WEXITSTATUS(raw) : -1;
 #endif
   return HostRun{status, readFile(base + "out"), readFile(base + "err")};
 }
 
 TEST(ConsoleTest, LineSyntaxReachesTheCommands) {
-  const HostRun run = runHost(
-      "--json -e 'strLeft \"a\\\"b\\\\c\\td\" -2' -e 'strMid abcdef 2 -1' "
-      "-e 'strTokArray -delims \",\" -matchAll \"x,\\x41,\"' -e 'strFind \"-x\" -x 0'");
+  const HostRun run =
+      runHost({"--json"},
+              "strLeft \"a\\\"b\\\\c\\td\" -2\nstrMid abcdef 2 -1\n"
+              "strTokArray -delims \",\" -matchAll \"x,\\x41,\"\nstrFind \"-x\" -x 0\n");
   EXPECT_EQ(
       run.out,
       "{\"line\": 1, \"command\": \"strLeft\", \"ran\": true, \"ok\": true, \"type\": 3, "
@@ -61,16 +80,23 @@ TEST(ConsoleTest, LineSyntaxReachesTheCommands) {
   EXPECT_EQ(run.status, 1) << "a refused line sets the exit status";
 }
 
+TEST(ConsoleTest, RepeatedDashELinesRunInOrder) {
+  const HostRun run =
+      runHost({"-e", "strLength abc", "-e", "strMid abcdef 2 -1", "-e", "strTok x"});
+  EXPECT_EQ(run.status, 0) << run.err;
+  EXPECT_EQ(run.out, "3\n\"cdef\"\n\"x\"\n");
+}
+
 TEST(ConsoleTest, EightBitBytesRoundTripThroughJson) {
-  const HostRun run = runHost("--json", "strRight \"\\xe9\\x7f\\x01z\" 99\n");
+  const HostRun run = runHost({"--json"}, "strRight \"\\xe9\\x7f\\x01z\" 99\n");
   EXPECT_NE(run.out.find("\"value\": \"\\u00e9\\u007f\\u0001z\""), std::string::npos) << run.out;
 }
 
 TEST(ConsoleTest, PlainOutputQuotesAsTheLineSyntaxReads) {
-  const HostRun run = runHost("", "strRight \"\\t\\\"\\\\\\x01\\x7f\\xe9\" 99\nstrLength \"\"\n");
+  const HostRun run = runHost({}, "strRight \"\\t\\\"\\\\\\x01\\x7f\\xe9\" 99\nstrLength \"\"\n");
   EXPECT_EQ(run.status, 0) << run.err;
   EXPECT_EQ(run.out, "\"\\t\\\"\\\\\\x01\\x7f\xe9\"\n0\n");
-  const HostRun list = runHost("--list");
+  const HostRun list = runHost({"--list"});
   EXPECT_NE(
       list.out.find(
           "8 strTok (String): Get HString Token\n  usage: strTok \"string\"\n"
@@ -80,7 +106,7 @@ TEST(ConsoleTest, PlainOutputQuotesAsTheLineSyntaxReads) {
 }
 
 TEST(ConsoleTest, StrTokWalksAcrossLinesAndMessagesAreShown) {
-  const HostRun run = runHost("",
+  const HostRun run = runHost({},
                               "# a walk\n\nstrTok -delims ; \"a;b\"\nstrTok -delims ;\nstrTok\n"
                               "strTokArray \" \"\ntestPrint\n");
   EXPECT_EQ(run.status, 0);
@@ -93,7 +119,7 @@ TEST(ConsoleTest, StrTokWalksAcrossLinesAndMessagesAreShown) {
 }
 
 TEST(ConsoleTest, RefusalsAreNamedAndTheRunGoesOn) {
-  const HostRun run = runHost("",
+  const HostRun run = runHost({},
                               "nope 1\nstrLeft \"abc\"\nstrLength \"x\\x00\"\n"
                               "strReverseFind abc \"\"\nstrLength abc\n");
   EXPECT_EQ(run.status, 1);
@@ -106,20 +132,21 @@ TEST(ConsoleTest, RefusalsAreNamedAndTheRunGoesOn) {
 }
 
 TEST(ConsoleTest, LoadAndUsageErrorsExitWithTwo) {
-  const HostRun missing = runHost("--module /nonexistent/TavixStringCmds.hll -e 'strLength a'");
+  const HostRun missing =
+      runHost({"--module", "/nonexistent/TavixStringCmds.hll", "-e", "strLength a"});
   EXPECT_EQ(missing.status, 2);
   EXPECT_EQ(missing.out, "");
   EXPECT_NE(missing.err.find("cannot load /nonexistent/TavixStringCmds.hll"), std::string::npos);
   EXPECT_EQ(std::count(missing.err.begin(), missing.err.end(), '\n'), 1);
 
-  const HostRun notAModule = runHost("--module " + quoteArg(TAVIX_HOST_PATH) + " -e 'strLength a'");
+  const HostRun notAModule = runHost({"--module", hostPath(), "-e", "strLength a"});
   EXPECT_EQ(notAModule.status, 2);
-  EXPECT_EQ(runHost("--bogus").status, 2);
-  EXPECT_EQ(runHost("-e").status, 2);
+  EXPECT_EQ(runHost({"--bogus"}).status, 2);
+  EXPECT_EQ(runHost({"-e"}).status, 2);
 }
 
 TEST(ConsoleTest, ListShowsEveryCommand) {
-  const HostRun run = runHost("--list --json");
+  const HostRun run = runHost({"--list", "--json"});
   EXPECT_EQ(run.status, 0);
   EXPECT_EQ(run.out.rfind("{\"plugin\": {\"maker\": \"Orlem\", \"publisher\": \"Orlem\", ", 0), 0u);
   EXPECT_NE(run.out.find("\"name\": \"Tavix String Commands\", \"release\": \"2.00\", "

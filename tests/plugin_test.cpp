@@ -7,6 +7,7 @@
 
 #include "../host/plugin_exports.h"
 #include "command_runner.h"
+#include "module_malloc_hook.h"
 
 namespace {
 
@@ -14,7 +15,7 @@ class PluginTest : public ::testing::Test {
  protected:
   void SetUp() override {
     std::string error;
-    library = ModuleLibrary::open(TAVIX_MODULE_PATH, error);
+    library = ModuleLibrary::open(defaultModulePath(), error);
     ASSERT_TRUE(library) << error;
     getPlugin = library->function<GetPluginFn>("getPlugin");
     ASSERT_NE(getPlugin, nullptr);
@@ -108,6 +109,31 @@ TEST_F(PluginTest, InitializeCreatesTheElevenCommandsInOrderAndAgainBehind) {
 
   std::vector<Command*> all;
   for (int i = 0; i < plugin->getNumCommands(); ++i) all.push_back(plugin->getCommand(i));
+  plugin->deleteThis();
+  for (Command* c : all) c->deleteThis();
+}
+
+TEST_F(PluginTest, RefusedListGrowthReachesTheHostAsE1224AndKeepsTheList) {
+  CommandPluginBase* plugin = getPlugin(0);
+  plugin->initialize();  // 11 commands in 16 slots
+  std::vector<Command*> all;
+  {
+    ModuleMallocHook hook("TavixStringCmds.hll");
+    ASSERT_TRUE(hook.installed());
+    hook.failNextRequest();  // the 17th append must grow the list
+    try {
+      plugin->initialize();
+      ADD_FAILURE() << "initialize returned";
+    } catch (const char* message) {
+      EXPECT_STREQ(message, "E1224: Out of memory in TSimpleArray::addSpace");
+    }
+  }
+  ASSERT_EQ(plugin->getNumCommands(), 16);
+  for (int i = 0; i < 16; ++i) {
+    all.push_back(plugin->getCommand(i));
+    EXPECT_STREQ(all.back()->getName(), kCommandOrder[i % 11]) << i;
+  }
+  EXPECT_EQ(plugin->getCommand(16), nullptr);
   plugin->deleteThis();
   for (Command* c : all) c->deleteThis();
 }

@@ -7,7 +7,9 @@
 #include <vector>
 
 #if defined(_WIN32)
+#include <fcntl.h>
 #include <io.h>
+#include <windows.h>
 #else
 #include <unistd.h>
 #endif
@@ -38,7 +40,8 @@ struct Options {
 
 bool standardInputIsTerminal() {
 #if defined(_WIN32)
-  return _isatty(0) != 0;
+  DWORD mode = 0;  // only a console has a console mode; files and pipes do not
+  return GetConsoleMode(GetStdHandle(STD_INPUT_HANDLE), &mode) != 0;
 #else
   return isatty(0) != 0;
 #endif
@@ -95,6 +98,11 @@ bool runStream(Console& console, std::istream& in, const char* prompt) {
 }  // namespace
 
 int main(int argc, char** argv) {
+#if defined(_WIN32)
+  // Byte-for-byte the same output as on other systems: no CR before each LF.
+  _setmode(_fileno(stdout), _O_BINARY);
+  _setmode(_fileno(stderr), _O_BINARY);
+#endif
   Options options;
   const int status = parseOptions(argc, argv, options);
   if (status >= 0) return status;

@@ -1,0 +1,23 @@
+// Redirects the malloc that a loaded module imports, so that a test can make
+// the module's own heap requests fail, as a host under memory pressure would
+// see them. Other code keeps the real malloc.
+#pragma once
+
+#include <cstddef>
+
+class ModuleMallocHook {
+ public:
+  // Patches the module loaded from a file with this name (without folder).
+  explicit ModuleMallocHook(const char* moduleFileName);
+  ~ModuleMallocHook();
+  ModuleMallocHook(const ModuleMallocHook&) = delete;
+  ModuleMallocHook& operator=(const ModuleMallocHook&) = delete;
+
+  // Whether the module's malloc import was found and redirected.
+  bool installed() const { return m_slot != nullptr; }
+  // The module's next malloc returns null; later ones succeed again.
+  void failNextRequest();
+
+ private:
+  void** m_slot = nullptr;
+};

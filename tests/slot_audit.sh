@@ -1,0 +1,32 @@
+#!/usr/bin/env bash
+# Compiles the host headers and the module's classes for the Microsoft C++ ABI
+# and compares every class's virtual table slots with slot_table.txt: hosts
+# call the plug-in and the commands through these slots.
+set -euo pipefail
+here=$(cd "$(dirname "$0")" && pwd)
+compiler=${CLANGXX:-clang++}
+resource=$("$compiler" -print-resource-dir)
+
+dump=$("$compiler" -target x86_64-pc-windows-msvc -std=c++17 -fno-rtti -fgnuc-version=12 \
+  -nostdinc -isystem /usr/share/mingw-w64/include -isystem "$resource/include" \
+  -S -o /dev/null -Xclang -fdump-vtable-layouts "$here/slot_audit.cpp")
+
+# One line per slot: class, slot, the qualified operation (and "pure").
+actual=$(printf '%s\n' "$dump" | awk '
+  /^VFTable for / { n = split($0, q, "\047"); cls = q[n - 1]; next }
+  /^$/ { cls = ""; next }
+  cls != "" && /^ *[0-9]+ \| / {
+    slot = $1
+    entry = $0; sub(/^ *[0-9]+ \| /, "", entry)
+    name = entry; sub(/\(.*/, "", name); n = split(name, w, " "); name = w[n]
+    sub(/^\*/, "", name)
+    print cls, slot, name (entry ~ /\[pure\]/ ? " pure" : "")
+  }' | sort -u -k1,1 -k2,2n)
+expected=$(sed -e '/^#/d' -e '/^$/d' "$here/slot_table.txt" | sort -u -k1,1 -k2,2n)
+
+if ! differences=$(diff <(printf '%s\n' "$expected") <(printf '%s\n' "$actual")); then
+  echo "slot audit failed (< expected, > built):"
+  printf '%s\n' "$differences" | grep '^[<>]'
+  exit 1
+fi
+echo "slot audit passed: $(printf '%s\n' "$actual" | wc -l) slots in $(printf '%s\n' "$actual" | cut -d' ' -f1 | sort -u | wc -l) classes"
