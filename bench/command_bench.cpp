@@ -10,6 +10,7 @@
 
 #include "../host/log_sink.h"
 #include "../tools/plugin_session.h"
+#include "../tools/script_values.h"
 
 namespace {
 
@@ -28,15 +29,11 @@ PluginSession& module() {
 }
 
 Variable str(const char* text) {
-  Variable v;
-  v.setValue(text, -1);
-  return v;
+  return stringValue(text);
 }
 
 Variable num(int value) {
-  Variable v;
-  v.setValue(value, -1);
-  return v;
+  return integerValue(value);
 }
 
 // One command call, built once and executed per iteration.

@@ -94,17 +94,15 @@ void Command::unref() {
 void Command::logError(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  const std::string message = formatText(format, arguments);
+  logFormatted(LogError, format, arguments);
   va_end(arguments);
-  logMessage(LogError, message.c_str());
 }
 
 void Command::logWarning(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  const std::string message = formatText(format, arguments);
+  logFormatted(LogWarning, format, arguments);
   va_end(arguments);
-  logMessage(LogWarning, message.c_str());
 }
 
 const char* Command::getName() const {

@@ -14,7 +14,6 @@ Database* g_db = &g_hostDatabase;
 void Database::logInfo(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  const std::string message = formatText(format, arguments);
+  logFormatted(LogInfo, format, arguments);
   va_end(arguments);
-  logMessage(LogInfo, message.c_str());
 }

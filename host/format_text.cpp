@@ -13,3 +13,7 @@ std::string formatText(const char* format, va_list arguments) {
   std::vsnprintf(&text[0], text.size() + 1, format, arguments);
   return text;
 }
+
+void logFormatted(LogLevel level, const char* format, va_list arguments) {
+  logMessage(level, formatText(format, arguments).c_str());
+}

@@ -3,15 +3,11 @@
 #include <gtest/gtest.h>
 
 Variable str(const char* text) {
-  Variable v;
-  v.setValue(text, -1);
-  return v;
+  return stringValue(text);
 }
 
 Variable num(int value) {
-  Variable v;
-  v.setValue(value, -1);
-  return v;
+  return integerValue(value);
 }
 
 Given flag(int index) {

@@ -11,6 +11,7 @@
 #include "../host/command.h"
 #include "../tools/log_capture.h"
 #include "../tools/plugin_session.h"
+#include "../tools/script_values.h"
 
 Variable str(const char* text);
 Variable num(int value);
