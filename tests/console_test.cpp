@@ -96,13 +96,6 @@ TEST(ConsoleTest, PlainOutputQuotesAsTheLineSyntaxReads) {
   const HostRun run = runHost({}, "strRight \"\\t\\\"\\\\\\x01\\x7f\\xe9\" 99\nstrLength \"\"\n");
   EXPECT_EQ(run.status, 0) << run.err;
   EXPECT_EQ(run.out, "\"\\t\\\"\\\\\\x01\\x7f\xe9\"\n0\n");
-  const HostRun list = runHost({"--list"});
-  EXPECT_NE(
-      list.out.find(
-          "8 strTok (String): Get HString Token\n  usage: strTok \"string\"\n"
-          "  options: -delims VALUE -matchAll\n  returns: string (3), canExecuteSolo: true\n"),
-      std::string::npos)
-      << list.out;
 }
 
 TEST(ConsoleTest, StrTokWalksAcrossLinesAndMessagesAreShown) {

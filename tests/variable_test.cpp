@@ -4,21 +4,6 @@
 
 namespace {
 
-TEST(VariableTest, PlainValuesChangeType) {
-  Variable v;
-  EXPECT_EQ(v.getType(), Variable::TypeNone);
-  v.setValue(-5, -1);
-  EXPECT_EQ(v.getType(), Variable::TypeInt);
-  EXPECT_EQ(v.getIntValue(-1), -5);
-  EXPECT_STREQ(v.getStringValue(-1), "");
-  v.setValue("text", -1);
-  EXPECT_EQ(v.getType(), Variable::TypeString);
-  EXPECT_STREQ(v.getStringValue(-1), "text");
-  EXPECT_EQ(v.getIntValue(-1), 0);
-  v.setValue(nullptr, -1);
-  EXPECT_STREQ(v.getStringValue(-1), "");
-}
-
 TEST(VariableTest, ArrayElementsStayInRange) {
   Variable array(Variable::TypeStringArray, 2);
   array.setValue("a", 0);
