@@ -241,7 +241,6 @@ int HString::Replace(const char* oldText, const char* newText) {
 void HString::Format(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  const std::string text = formatText(format, arguments);
+  formatInto(*this, format, arguments);
   va_end(arguments);
-  assign(text.c_str(), std::strlen(text.c_str()));  // a %c of NUL ends the text
 }

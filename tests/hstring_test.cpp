@@ -71,6 +71,8 @@ TEST(HStringTest, FormatBuildsPrintfText) {
   HString text("old");
   text.Format("%d-%s-%c", 42, "x", 'y');
   EXPECT_STREQ(text.GetStr(), "42-x-y");
+  text.Format("<%s>", text.GetStr());  // from its own text
+  EXPECT_STREQ(text.GetStr(), "<42-x-y>");
   text.Format("%s", "");
   EXPECT_TRUE(text.IsEmpty());
 }
