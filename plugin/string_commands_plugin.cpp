@@ -57,7 +57,7 @@ void TavixStringCommandsPlugin::addCommand() {
   std::unique_ptr<CommandClass, void (*)(CommandClass*)> command(
       new CommandClass(), [](CommandClass* c) { c->deleteThis(); });
   m_commands.add(command.get());
-  command.release();
+  static_cast<void>(command.release());  // the list holds it now
 }
 
 bool TavixStringCommandsPlugin::initialize() {
