@@ -18,12 +18,16 @@ size_t textLength(const char* text) {
   return text == nullptr ? 0 : std::strlen(text);
 }
 
-// Finds one needle in texts in time linear in text and needle
-// (Knuth-Morris-Pratt); single bytes go straight to memchr.
+// Finds one needle in texts in time linear in text and needle. Needles of up
+// to kShortNeedle bytes are compared in place after a memchr for their first
+// byte (at most kShortNeedle comparisons per text byte, and no table to
+// build); longer ones use Knuth-Morris-Pratt.
 class Searcher {
  public:
+  static constexpr size_t kShortNeedle = 16;
+
   Searcher(const char* needle, size_t length) : m_needle(needle), m_length(length) {
-    if (m_length < 2) return;
+    if (m_length <= kShortNeedle) return;
     m_border.assign(m_length, 0);
     size_t k = 0;
     for (size_t i = 1; i < m_length; ++i) {
@@ -37,9 +41,15 @@ class Searcher {
   size_t find(const char* text, size_t textLength, size_t from) const {
     if (m_length == 0) return from;
     if (m_length > textLength - from) return npos;
-    if (m_length == 1) {
-      const void* hit = std::memchr(text + from, m_needle[0], textLength - from);
-      return hit == nullptr ? npos : static_cast<size_t>(static_cast<const char*>(hit) - text);
+    if (m_length <= kShortNeedle) {
+      const char* last = text + (textLength - m_length);  // the last possible start
+      for (const char* at = text + from; at <= last; ++at) {
+        at = static_cast<const char*>(
+            std::memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
+        if (at == nullptr) return npos;
+        if (std::memcmp(at, m_needle, m_length) == 0) return static_cast<size_t>(at - text);
+      }
+      return npos;
     }
     size_t matched = 0;
     for (size_t i = from; i < textLength; ++i) {

@@ -16,9 +16,17 @@ TEST(HStringTest, FindMatchesPartialOverlapsAndClampsItsStart) {
     int expected;
   };
   const Case cases[] = {
-      {"aaab", "aab", 0, 1},  {"abababc", "ababc", 0, 2}, {"ab", "abc", 0, -1},
-      {"abcabc", "bc", 2, 4}, {"abcabc", "", -1, 0},      {"abcabc", "", 6, 6},
-      {"abcabc", "", 7, -1},  {"x\x80y", "\x80", 0, 1},
+      {"aaab", "aab", 0, 1},
+      {"abababc", "ababc", 0, 2},
+      {"ab", "abc", 0, -1},
+      {"abcabc", "bc", 2, 4},
+      {"abcabc", "", -1, 0},
+      {"abcabc", "", 6, 6},
+      {"abcabc", "", 7, -1},
+      {"x\x80y", "\x80", 0, 1},
+      // Needles longer than 16 bytes take the table-driven search.
+      {"aaaaaaaaaaaaaaaaaaaaab", "aaaaaaaaaaaaaaaaab", 0, 4},
+      {"abcabcabcabcabcabcab.abcabcabcabcabcabcabd", "abcabcabcabcabcabd", 0, 24},
   };
   for (const Case& c : cases) {
     SCOPED_TRACE(std::string(c.text) + " / " + c.sub + " @" + std::to_string(c.start));
