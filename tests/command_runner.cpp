@@ -54,14 +54,8 @@ std::unique_ptr<PluginSession> freshModule() {
   return session;
 }
 
-PluginSession& loadedModule() {
-  static std::unique_ptr<PluginSession> session = freshModule();
-  if (!session) std::abort();
-  return *session;
-}
-
 Command& command(const char* name) {
-  Command* found = loadedModule().find(name);
+  Command* found = sharedDefaultSession().find(name);
   if (found == nullptr) {
     ADD_FAILURE() << "no command " << name;
     std::abort();

@@ -38,9 +38,8 @@ struct CommandRun {
 CommandRun runCommand(Command& command, const std::vector<Variable>& args,
                       const std::vector<Given>& options = {});
 
-// The module, loaded once per test program.
-PluginSession& loadedModule();
-// A module loaded afresh, with new command objects.
+// A module loaded afresh, with new command objects; command() uses the
+// program's shared one.
 std::unique_ptr<PluginSession> freshModule();
 Command& command(const char* name);
 

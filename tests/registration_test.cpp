@@ -89,7 +89,7 @@ const Registration kRegistrations[] = {
 };
 
 TEST(RegistrationTest, EveryCommandDeclaresItselfAsDocumented) {
-  const std::vector<Command*>& commands = loadedModule().commands();
+  const std::vector<Command*>& commands = sharedDefaultSession().commands();
   ASSERT_EQ(commands.size(), std::size(kRegistrations));
   for (size_t i = 0; i < commands.size(); ++i) {
     const Registration& r = kRegistrations[i];

@@ -7,6 +7,7 @@
 #include "../host/plugin_exports.h"
 #include "log_capture.h"
 #include "script_line.h"
+#include "script_values.h"
 #include "text_escape.h"
 
 namespace {
@@ -26,30 +27,26 @@ bool buildCall(const Command& command, const std::vector<ScriptWord>& words, TAr
                TArray<CommandOption>& options, std::string& error) {
   for (size_t i = 1; i < words.size(); ++i) {
     const ScriptWord& word = words[i];
-    Variable value;
-    if (word.kind == ScriptWord::Option) {
-      int index = -1;
-      Variable::VarType type = Variable::TypeNone;
-      if (command.getOptionSyntax(word.text.c_str(), index, type) == 0) {
-        error = "unknown option -" + word.text + " for " + command.getName();
-        return false;
-      }
-      if (type != Variable::TypeNone) {
-        if (++i == words.size()) {
-          error = "option -" + word.text + " needs a value";
-          return false;
-        }
-        value.setValue(words[i].text.c_str(), -1);
-      }
-      options.add(CommandOption::given(index, value));
+    if (word.kind != ScriptWord::Option) {
+      args.add(word.kind == ScriptWord::Integer ? integerValue(word.number)
+                                                : stringValue(word.text.c_str()));
       continue;
     }
-    if (word.kind == ScriptWord::Integer) {
-      value.setValue(word.number, -1);
-    } else {
-      value.setValue(word.text.c_str(), -1);
+    int index = -1;
+    Variable::VarType type = Variable::TypeNone;
+    if (command.getOptionSyntax(word.text.c_str(), index, type) == 0) {
+      error = "unknown option -" + word.text + " for " + command.getName();
+      return false;
     }
-    args.add(value);
+    Variable value;
+    if (type != Variable::TypeNone) {
+      if (++i == words.size()) {
+        error = "option -" + word.text + " needs a value";
+        return false;
+      }
+      value = stringValue(words[i].text.c_str());
+    }
+    options.add(CommandOption::given(index, value));
   }
   return true;
 }
