@@ -37,7 +37,7 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, size_t size) {
   std::ostringstream out;
   std::ostringstream err;
   LogCapture quiet;
-  Console console(sharedDefaultSession(), size % 2 == 0, out, err);
+  Console console(sharedDefaultSession(), static_cast<ConsoleMode>(size % 3), out, err);
   console.runLine(1, line);
   return 0;
 }

@@ -82,7 +82,8 @@ std::string jsonBool(bool value) {
 
 // An integer in decimal, a string quoted by quote, an array as a bracketed
 // list of quoted strings; the empty text for no value.
-std::string formatValue(const Variable& value, std::string (*quote)(const std::string&)) {
+template <class Quote>
+std::string formatValue(const Variable& value, Quote quote) {
   switch (value.getType()) {
     case Variable::TypeInt:
       return std::to_string(value.getIntValue(-1));
@@ -121,6 +122,22 @@ std::string jsonLine(int lineNumber, const LineOutcome& outcome) {
   return out.str();
 }
 
+// A line's outcome on one line, as a script case writes it after "# =>":
+// the messages logged, the console's own reason when it refused or cut the
+// line short, the result, and "failed" when execute returned false; strings
+// quoted in ASCII. "nothing" when there is none of these.
+std::string describeOutcome(const LineOutcome& outcome) {
+  const auto quote = [](const std::string& text) { return quoteScriptString(text, true); };
+  std::string out;
+  const auto add = [&out](const std::string& piece) { out += (out.empty() ? "" : " ") + piece; };
+  for (const LogEntry& entry : outcome.log)
+    add(std::string(logLevelName(entry.level)) + " " + quote(entry.message));
+  if (!outcome.error.empty()) add((outcome.ran ? "aborted " : "refused ") + quote(outcome.error));
+  if (outcome.result.getType() != Variable::TypeNone) add(formatValue(outcome.result, quote));
+  if (outcome.ran && !outcome.ok && outcome.error.empty()) add("failed");
+  return out.empty() ? "nothing" : out;
+}
+
 const char* typeName(Variable::VarType type) {
   switch (type) {
     case Variable::TypeInt:
@@ -137,17 +154,23 @@ const char* typeName(Variable::VarType type) {
 
 }  // namespace
 
-bool Console::runLine(int lineNumber, const std::string& line) {
-  if (isSkippedLine(line)) return true;
+LineOutcome runText(PluginSession& session, const std::string& line) {
   std::vector<ScriptWord> words;
   LineOutcome outcome;
   if (!splitScriptLine(line, words, outcome.error)) {
     if (!words.empty()) outcome.command = words[0].text;
-  } else {
-    outcome = runWords(m_session, words);
+  } else if (!words.empty()) {
+    outcome = runWords(session, words);
   }
+  return outcome;
+}
 
-  if (m_json) {
+bool Console::runLine(int lineNumber, const std::string& line) {
+  if (isSkippedLine(line)) return true;
+  if (m_mode == ConsoleMode::Check) return checkLine(lineNumber, line);
+  const LineOutcome outcome = runText(m_session, line);
+
+  if (m_mode == ConsoleMode::Json) {
     m_out << jsonLine(lineNumber, outcome) << std::endl;
   } else {
     for (const LogEntry& entry : outcome.log) {
@@ -156,9 +179,26 @@ bool Console::runLine(int lineNumber, const std::string& line) {
     if (!outcome.error.empty())
       m_err << "line " << lineNumber << ": " << outcome.error << std::endl;
     if (outcome.result.getType() != Variable::TypeNone)
-      m_out << formatValue(outcome.result, quoteScriptString) << std::endl;
+      m_out << formatValue(outcome.result, [](const std::string& text) {
+        return quoteScriptString(text);
+      }) << std::endl;
   }
   return outcome.ran && outcome.ok;
+}
+
+bool Console::checkLine(int lineNumber, const std::string& line) {
+  std::string caseText = line;
+  std::string expected;
+  const bool noted = splitExpectation(line, caseText, expected);
+  const std::string actual = describeOutcome(runText(m_session, caseText));
+  ++m_casesRun;
+  if (noted && actual == expected) return true;
+  ++m_casesDiffering;
+  m_out << m_source << ":" << lineNumber << ": "
+        << caseText.substr(0, caseText.find_last_not_of(" \t") + 1)
+        << "\n  expected: " << (noted ? expected : "(no \"# =>\" note)")
+        << "\n  actual:   " << actual << std::endl;
+  return false;
 }
 
 void Console::list() {
@@ -173,7 +213,7 @@ void Console::list() {
   };
   const std::vector<Command*>& commands = m_session.commands();
 
-  if (!m_json) {
+  if (m_mode != ConsoleMode::Json) {
     for (const auto& [key, text] : identity) m_out << key << ": " << text << "\n";
     m_out << "apiVersion: " << m_session.apiVersion() << "\n";
     for (size_t i = 0; i < commands.size(); ++i) {

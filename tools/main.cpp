@@ -24,15 +24,16 @@ constexpr int kSomeFailed = 1;
 constexpr int kUsageOrLoadError = 2;
 
 const char kUsage[] =
-    "usage: tavix-host [--module PATH] [--json] [--list] [-e LINE]... [SCRIPT]\n"
+    "usage: tavix-host [--module PATH] [--json | --check] [--list] [-e LINE]... [SCRIPT]\n"
     "  Runs script lines from SCRIPT, from each -e LINE, or from standard input.\n"
     "  --module PATH  the module to load (default: TavixStringCmds.hll beside tavix-host)\n"
     "  --json         one JSON object per executed line\n"
+    "  --check        compare each line's outcome with the \"# => outcome\" beside it\n"
     "  --list         show the plug-in and its commands\n";
 
 struct Options {
   std::string modulePath;
-  bool json = false;
+  ConsoleMode mode = ConsoleMode::Plain;
   bool list = false;
   std::vector<std::string> lines;
   std::string script;
@@ -59,8 +60,9 @@ int parseOptions(int argc, char** argv, Options& options) {
     if (arg == "--help" || arg == "-h") {
       std::cout << kUsage;
       return kAllRan;
-    } else if (arg == "--json") {
-      options.json = true;
+    } else if (arg == "--json" || arg == "--check") {
+      if (options.mode != ConsoleMode::Plain) return usageError("give one of --json and --check");
+      options.mode = arg == "--json" ? ConsoleMode::Json : ConsoleMode::Check;
     } else if (arg == "--list") {
       options.list = true;
     } else if (arg == "--module" || arg == "-e") {
@@ -120,7 +122,10 @@ int main(int argc, char** argv) {
     return kUsageOrLoadError;
   }
 
-  Console console(*session, options.json, std::cout, std::cerr);
+  const std::string source = !options.lines.empty() ? "-e"
+                             : script.is_open()     ? options.script
+                                                    : "standard input";
+  Console console(*session, options.mode, std::cout, std::cerr, source);
   if (options.list) {
     console.list();
     if (options.lines.empty() && options.script.empty()) return kAllRan;
@@ -134,6 +139,14 @@ int main(int argc, char** argv) {
     allOk = runStream(console, script, nullptr);
   } else {
     allOk = runStream(console, std::cin, standardInputIsTerminal() ? "tavix> " : nullptr);
+  }
+  if (options.mode == ConsoleMode::Check) {
+    std::cout << source << ": ";
+    if (console.casesDiffering() == 0) {
+      std::cout << console.casesRun() << " cases as expected\n";
+    } else {
+      std::cout << console.casesDiffering() << " of " << console.casesRun() << " cases differ\n";
+    }
   }
   return allOk ? kAllRan : kSomeFailed;
 }

@@ -95,7 +95,7 @@ bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, st
   size_t pos = 0;
   while (true) {
     while (pos < line.size() && isBlank(line[pos])) ++pos;
-    if (pos == line.size()) return true;
+    if (pos == line.size() || line[pos] == '#') return true;  // the rest is a comment
     if (line[pos] == '"') {
       ScriptWord word{ScriptWord::String, std::string(), 0};
       if (!readQuoted(line, pos, word.text, error)) return false;
@@ -120,6 +120,24 @@ bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, st
       words.push_back(ScriptWord{ScriptWord::String, bare, 0});
     }
   }
+}
+
+bool splitExpectation(const std::string& line, std::string& caseText, std::string& expected) {
+  for (size_t at = line.rfind('#'); at != std::string::npos; at = line.rfind('#', at - 1)) {
+    size_t pos = at + 1;
+    while (pos < line.size() && isBlank(line[pos])) ++pos;
+    if ((at == 0 || isBlank(line[at - 1])) && line.compare(pos, 2, "=>") == 0) {
+      caseText = line.substr(0, at);
+      pos += 2;
+      size_t end = line.size();
+      while (pos < end && isBlank(line[pos])) ++pos;
+      while (end > pos && isBlank(line[end - 1])) --end;
+      expected = line.substr(pos, end - pos);
+      return true;
+    }
+    if (at == 0) break;
+  }
+  return false;
 }
 
 bool isSkippedLine(const std::string& line) {

@@ -10,7 +10,7 @@ std::string hexByte(unsigned char byte) {
 
 }  // namespace
 
-std::string quoteScriptString(const std::string& text) {
+std::string quoteScriptString(const std::string& text, bool escapeHighBytes) {
   std::string out = "\"";
   for (char c : text) {
     const auto byte = static_cast<unsigned char>(c);
@@ -31,7 +31,7 @@ std::string quoteScriptString(const std::string& text) {
         out += "\\r";
         break;
       default:
-        if (byte < 0x20 || byte == 0x7F) {
+        if (byte < 0x20 || byte == 0x7F || (escapeHighBytes && byte >= 0x80)) {
           out += "\\x" + hexByte(byte);
         } else {
           out += c;
