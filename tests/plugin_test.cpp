@@ -1,15 +1,24 @@
-// The module's exports and plug-in object, reached only through the loader.
+// The module as a host meets it through its exports: the plug-in object's
+// life, its command list, and what the commands declare beyond what a script
+// sees. What each command computes is in cases/.
 #include <gtest/gtest.h>
 
+#include <climits>
 #include <regex>
 #include <string>
 #include <vector>
 
 #include "../host/plugin_exports.h"
-#include "command_runner.h"
+#include "../tools/module_loader.h"
+#include "../tools/plugin_session.h"
+#include "../tools/script_values.h"
 #include "module_malloc_hook.h"
 
 namespace {
+
+const char* const kCommandOrder[] = {"strCompare", "strFind",     "strLeft",  "strLength",
+                                     "strMid",     "strReplace",  "strRight", "strReverseFind",
+                                     "strTok",     "strTokArray", "testPrint"};
 
 class PluginTest : public ::testing::Test {
  protected:
@@ -21,13 +30,31 @@ class PluginTest : public ::testing::Test {
     ASSERT_NE(getPlugin, nullptr);
   }
 
+  // A plug-in with its commands created, and every command it listed.
+  CommandPluginBase* initialised(std::vector<Command*>& commands) {
+    CommandPluginBase* plugin = getPlugin(0);
+    EXPECT_TRUE(plugin->initialize());
+    for (int i = 0; i < plugin->getNumCommands(); ++i) commands.push_back(plugin->getCommand(i));
+    return plugin;
+  }
+
   std::unique_ptr<ModuleLibrary> library;
   GetPluginFn getPlugin = nullptr;
 };
 
-const char* const kCommandOrder[] = {"strCompare", "strFind",     "strLeft",  "strLength",
-                                     "strMid",     "strReplace",  "strRight", "strReverseFind",
-                                     "strTok",     "strTokArray", "testPrint"};
+// Runs a command on string arguments, with options of these declared indexes
+// whose values are ",".
+Variable run(Command& command, const std::vector<const char*>& texts,
+             const std::vector<int>& optionIndexes = {}) {
+  TArray<Variable> args;
+  for (const char* text : texts) args.add(stringValue(text));
+  TArray<CommandOption> options;
+  for (int index : optionIndexes) options.add(CommandOption::given(index, stringValue(",")));
+  EXPECT_TRUE(command.checkArgSyntax(args, options));
+  Variable result;
+  EXPECT_TRUE(command.execute(options, args, result));
+  return result;
+}
 
 TEST_F(PluginTest, PlainExportsAnswerTheirValues) {
   const auto apiVersion = library->function<ApiVersionFn>("apiVersion");
@@ -43,75 +70,51 @@ TEST_F(PluginTest, PlainExportsAnswerTheirValues) {
   EXPECT_EQ(getPlugin(-1), nullptr);
 }
 
-TEST_F(PluginTest, EachGetPluginMakesANewEmptyObject) {
+TEST_F(PluginTest, EachGetPluginMakesANewEmptyObjectWithItsIdentity) {
   CommandPluginBase* first = getPlugin(0);
   CommandPluginBase* second = getPlugin(0);
-  ASSERT_NE(first, nullptr);
-  ASSERT_NE(second, nullptr);
-  EXPECT_NE(first, second);
+  ASSERT_NE(first, second);
   EXPECT_EQ(first->getNumCommands(), 0);
-  EXPECT_EQ(second->getNumCommands(), 0);
   EXPECT_EQ(first->getCommand(0), nullptr);
+  EXPECT_STREQ(first->getMakerName().GetStr(), "Orlem");
+  EXPECT_STREQ(first->getPublisherName().GetStr(), "Orlem");
+  EXPECT_STREQ(first->getVersionString().GetStr(), "1.0");
+  EXPECT_STREQ(first->getPluginName().GetStr(), "Tavix String Commands");
+  EXPECT_STREQ(first->getReleaseString().GetStr(), "2.00");
+  EXPECT_TRUE(first->isReady());
+  EXPECT_EQ(first->getRuntimeClass(), &CommandPluginBase::s_classCommandPluginBase);
+  // "Jan  8 2025": month, blank, day padded with a blank, blank, year.
+  EXPECT_TRUE(std::regex_match(
+      first->getBuildDate().GetStr(),
+      std::regex("(Jan|Feb|Mar|Apr|May|Jun|Jul|Aug|Sep|Oct|Nov|Dec) ( [1-9]|[12][0-9]|3[01]) "
+                 "[0-9]{4}")));
   first->deleteThis();
   second->deleteThis();
 }
 
-TEST_F(PluginTest, IdentityAndHostSlots) {
-  CommandPluginBase* plugin = getPlugin(0);
-  EXPECT_STREQ(plugin->getMakerName().GetStr(), "Orlem");
-  EXPECT_STREQ(plugin->getPublisherName().GetStr(), "Orlem");
-  EXPECT_STREQ(plugin->getVersionString().GetStr(), "1.0");
-  EXPECT_STREQ(plugin->getPluginName().GetStr(), "Tavix String Commands");
-  EXPECT_STREQ(plugin->getReleaseString().GetStr(), "2.00");
-  EXPECT_TRUE(plugin->isReady());
-  EXPECT_EQ(plugin->getRuntimeClass(), &CommandPluginBase::s_classCommandPluginBase);
-
-  // "Jan  8 2025": month, blank, day padded with a blank, blank, year.
-  EXPECT_TRUE(std::regex_match(
-      plugin->getBuildDate().GetStr(),
-      std::regex(
-          "(Jan|Feb|Mar|Apr|May|Jun|Jul|Aug|Sep|Oct|Nov|Dec) ( [1-9]|[12][0-9]|3[01]) [0-9]{4}")));
-
-  plugin->loadScriptCommands();
-  EXPECT_EQ(plugin->getNumScriptCommands(), 0);
-  EXPECT_EQ(plugin->getScriptCommand(0), nullptr);
-  EXPECT_EQ(plugin->getNumControlStreamCommands(), 0);
-  EXPECT_EQ(plugin->getControlStreamCommand(0), nullptr);
-  EXPECT_EQ(plugin->getNumControlStreamEvents(), 0);
-  EXPECT_EQ(plugin->getControlStreamEvent(0), nullptr);
-  plugin->deleteThis();
-}
-
-TEST_F(PluginTest, InitializeCreatesTheElevenCommandsInOrderAndAgainBehind) {
-  CommandPluginBase* plugin = getPlugin(0);
-  EXPECT_TRUE(plugin->initialize());
-  ASSERT_EQ(plugin->getNumCommands(), 11);
-  std::vector<Command*> firstRound;
-  for (int i = 0; i < 11; ++i) {
-    firstRound.push_back(plugin->getCommand(i));
-    EXPECT_STREQ(firstRound.back()->getName(), kCommandOrder[i]) << i;
-  }
-  EXPECT_EQ(plugin->getCommand(-1), nullptr);
-  EXPECT_EQ(plugin->getCommand(11), nullptr);
-
+TEST_F(PluginTest, InitializeAppendsTheElevenCommandsInOrderEachTime) {
+  std::vector<Command*> commands;
+  CommandPluginBase* plugin = initialised(commands);
   EXPECT_TRUE(plugin->initialize());
   ASSERT_EQ(plugin->getNumCommands(), 22);
-  for (int i = 0; i < 11; ++i) {
-    EXPECT_EQ(plugin->getCommand(i), firstRound[static_cast<size_t>(i)]);
-    EXPECT_STREQ(plugin->getCommand(i + 11)->getName(), kCommandOrder[i]);
-    EXPECT_NE(plugin->getCommand(i + 11), firstRound[static_cast<size_t>(i)]);
+  for (int i = 0; i < 22; ++i) {
+    SCOPED_TRACE(i);
+    if (i < 11) {
+      EXPECT_EQ(plugin->getCommand(i), commands[static_cast<size_t>(i)]);
+    }
+    EXPECT_STREQ(plugin->getCommand(i)->getName(), kCommandOrder[i % 11]);
   }
-
-  std::vector<Command*> all;
-  for (int i = 0; i < plugin->getNumCommands(); ++i) all.push_back(plugin->getCommand(i));
+  EXPECT_NE(plugin->getCommand(11), commands[0]);
+  EXPECT_EQ(plugin->getCommand(-1), nullptr);
+  EXPECT_EQ(plugin->getCommand(22), nullptr);
+  for (int i = 11; i < 22; ++i) commands.push_back(plugin->getCommand(i));
   plugin->deleteThis();
-  for (Command* c : all) c->deleteThis();
+  for (Command* c : commands) c->deleteThis();
 }
 
 TEST_F(PluginTest, RefusedListGrowthReachesTheHostAsE1224AndKeepsTheList) {
-  CommandPluginBase* plugin = getPlugin(0);
-  plugin->initialize();  // 11 commands in 16 slots
-  std::vector<Command*> all;
+  std::vector<Command*> commands;
+  CommandPluginBase* plugin = initialised(commands);  // 11 commands in 16 slots
   {
     ModuleMallocHook hook("TavixStringCmds.hll");
     ASSERT_TRUE(hook.installed());
@@ -124,32 +127,45 @@ TEST_F(PluginTest, RefusedListGrowthReachesTheHostAsE1224AndKeepsTheList) {
     }
   }
   ASSERT_EQ(plugin->getNumCommands(), 16);
-  for (int i = 0; i < 16; ++i) {
-    all.push_back(plugin->getCommand(i));
-    EXPECT_STREQ(all.back()->getName(), kCommandOrder[i % 11]) << i;
+  for (int i = 11; i < 16; ++i) {
+    commands.push_back(plugin->getCommand(i));
+    EXPECT_STREQ(commands.back()->getName(), kCommandOrder[i - 11]);
   }
-  EXPECT_EQ(plugin->getCommand(16), nullptr);
   plugin->deleteThis();
-  for (Command* c : all) c->deleteThis();
+  for (Command* c : commands) c->deleteThis();
 }
 
-TEST_F(PluginTest, CommandsOutliveThePluginAndAreReleasedOneByOne) {
-  CommandPluginBase* plugin = getPlugin(0);
-  plugin->initialize();
+TEST_F(PluginTest, CommandsOutliveThePluginAndAreReleasedByReference) {
   std::vector<Command*> commands;
-  for (int i = 0; i < plugin->getNumCommands(); ++i) commands.push_back(plugin->getCommand(i));
+  initialised(commands)->deleteThis();
+  Command& length = *commands[3];
+  EXPECT_EQ(run(length, {"four"}).getIntValue(-1), 4);
+  length.ref();  // a reference the host still holds keeps it through deleteThis
+  length.deleteThis();
+  EXPECT_EQ(run(length, {"ab"}).getIntValue(-1), 2);
+  for (Command* c : commands) c->deleteThis();
+}
+
+TEST_F(PluginTest, CommandsDeclareWhatOnlyAHostSees) {
+  std::vector<Command*> commands;
+  CommandPluginBase* plugin = initialised(commands);
+  for (Command* c : commands) {
+    SCOPED_TRACE(c->getName());
+    EXPECT_EQ(c->getRuntimeClass(), &Command::s_classCommand);
+    EXPECT_FALSE(c->isUndoable());
+    int index = -1;
+    Variable::VarType type = Variable::TypeInt;
+    EXPECT_EQ(c->getOptionSyntax(nullptr, index, type), 0);
+    for (int o = 0; o < c->getNumOptions(); ++o) {
+      EXPECT_EQ(c->getOptionSyntax(c->getOption(o)->getName(), index, type), 1);
+      EXPECT_EQ(index, o);
+      EXPECT_EQ(type, c->getOption(o)->getValueType());
+    }
+  }
+  // Options with indexes a command never declared are passed over.
+  EXPECT_EQ(run(*commands[0], {"ABC", "abc"}, {1, -1, 31, 32, INT_MIN}).getIntValue(-1), 'A' - 'a');
+  EXPECT_EQ(run(*commands[9], {"a,b,c d"}, {2, -1, 33, INT_MIN}).getCount(), 2);
   plugin->deleteThis();
-
-  Command* length = commands[3];
-  EXPECT_STREQ(length->getName(), "strLength");
-  const CommandRun run = runCommand(*length, {str("four")});
-  EXPECT_TRUE(run.ok);
-  EXPECT_EQ(run.result.getIntValue(-1), 4);
-
-  // A reference the host still holds keeps the command through deleteThis.
-  length->ref();
-  length->deleteThis();
-  EXPECT_EQ(runCommand(*length, {str("ab")}).result.getIntValue(-1), 2);
   for (Command* c : commands) c->deleteThis();
 }
 
