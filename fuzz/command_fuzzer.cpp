@@ -16,20 +16,19 @@
 
 namespace {
 
-// The argument types each command takes, by position in the module's list.
-const std::vector<std::vector<Variable::VarType>> kShapes = {
-    {Variable::TypeString, Variable::TypeString},                        // strCompare
-    {Variable::TypeString, Variable::TypeString, Variable::TypeInt},     // strFind
-    {Variable::TypeString, Variable::TypeInt},                           // strLeft
-    {Variable::TypeString},                                              // strLength
-    {Variable::TypeString, Variable::TypeInt, Variable::TypeInt},        // strMid
-    {Variable::TypeString, Variable::TypeString, Variable::TypeString},  // strReplace
-    {Variable::TypeString, Variable::TypeInt},                           // strRight
-    {Variable::TypeString, Variable::TypeString},                        // strReverseFind
-    {Variable::TypeString},                                              // strTok
-    {Variable::TypeString},                                              // strTokArray
-    {},                                                                  // testPrint
-};
+// The argument types a command takes, read from its syntax text: a quoted
+// word is a string, a bare word an integer.
+std::vector<Variable::VarType> shape(const Command& command) {
+  HString syntax;
+  command.getArgSyntaxString(syntax);
+  const char* text = syntax.GetStr();
+  std::vector<Variable::VarType> types;
+  for (size_t i = 0; text[i] != '\0'; ++i) {
+    if (i == 0 || text[i - 1] == ' ')
+      types.push_back(text[i] == '"' ? Variable::TypeString : Variable::TypeInt);
+  }
+  return types;
+}
 
 const int kInterestingInts[] = {0, 1, 2, 3, -1, -2, -5, INT_MIN, INT_MAX, INT_MIN + 1, 64};
 
@@ -118,8 +117,9 @@ void runOneCall(FuzzedDataProvider& data) {
 
   TArray<Variable> args;
   if (data.ConsumeBool()) {  // the command's own shape, so that it runs
-    const size_t count = (name == "strTok" && data.ConsumeBool()) ? 0 : kShapes[position].size();
-    for (size_t i = 0; i < count; ++i) args.add(value(data, kShapes[position][i]));
+    const std::vector<Variable::VarType> types = shape(command);
+    const size_t count = (name == "strTok" && data.ConsumeBool()) ? 0 : types.size();
+    for (size_t i = 0; i < count; ++i) args.add(value(data, types[i]));
   } else {
     const int count = data.ConsumeIntegralInRange(0, 4);
     for (int i = 0; i < count; ++i) args.add(value(data, anyType(data)));
