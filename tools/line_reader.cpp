@@ -1,0 +1,37 @@
+#include "line_reader.h"
+
+#include <errno.h>
+#include <string.h>
+
+#include "../host/out_of_memory.h"
+
+bool LineReader::refill() {
+  errno = 0;
+  m_start = 0;
+  m_end = fread(m_block, 1, sizeof(m_block), m_file);
+  if (m_end == 0 && ferror(m_file)) m_failure = strerror(errno != 0 ? errno : EIO);
+  return m_end > 0;
+}
+
+bool LineReader::next(ByteBuffer& line) {
+  line.clear();
+  bool any = false;
+  try {
+    while (m_failure == nullptr && (m_start < m_end || refill())) {
+      any = true;
+      const char* from = m_block + m_start;
+      const auto* feed = static_cast<const char*>(memchr(from, '\n', m_end - m_start));
+      const size_t count = feed == nullptr ? m_end - m_start : static_cast<size_t>(feed - from);
+      line.append(from, count);
+      m_start += count + (feed != nullptr);
+      if (feed != nullptr) break;
+    }
+  } catch (const OutOfMemory&) {
+    snprintf(m_reason, sizeof(m_reason), "line %d is too long to hold in memory", m_lineNumber + 1);
+    m_failure = m_reason;
+    line.release();
+  }
+  if (m_failure != nullptr || !any) return false;
+  if (++m_lineNumber == 1 && strncmp(line.data(), "\xEF\xBB\xBF", 3) == 0) line.dropFront(3);
+  return true;
+}

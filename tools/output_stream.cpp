@@ -1,0 +1,55 @@
+#include "output_stream.h"
+
+#include <errno.h>
+#include <string.h>
+
+void OutputStream::write(const char* bytes, size_t count) {
+  if (m_file == nullptr) {
+    m_memory.append(bytes, count);
+    return;
+  }
+  if (count > sizeof(m_buffer) - m_used) {
+    flush();
+    if (count > sizeof(m_buffer)) {
+      errno = 0;
+      if (m_error == 0 && fwrite(bytes, 1, count, m_file) != count) m_error = errno ? errno : EIO;
+      return;
+    }
+  }
+  memcpy(m_buffer + m_used, bytes, count);
+  m_used += count;
+}
+
+OutputStream& OutputStream::operator<<(const char* text) {
+  write(text, strlen(text));
+  return *this;
+}
+
+OutputStream& OutputStream::operator<<(char c) {
+  write(&c, 1);
+  return *this;
+}
+
+OutputStream& OutputStream::operator<<(long long number) {
+  char digits[24];
+  const int length = snprintf(digits, sizeof(digits), "%lld", number);
+  write(digits, static_cast<size_t>(length));
+  return *this;
+}
+
+bool OutputStream::flush() {
+  if (m_file == nullptr) return true;
+  // After a failure nothing more is written: what follows would have a gap before it.
+  errno = 0;
+  if (m_error == 0 && m_used > 0 && fwrite(m_buffer, 1, m_used, m_file) != m_used) {
+    m_error = errno ? errno : EIO;
+  }
+  m_used = 0;
+  errno = 0;
+  if (m_error == 0 && fflush(m_file) != 0) m_error = errno ? errno : EIO;
+  return m_error == 0;
+}
+
+const char* OutputStream::failure() const {
+  return m_error == 0 ? nullptr : strerror(m_error);
+}
