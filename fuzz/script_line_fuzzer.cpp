@@ -1,11 +1,7 @@
 // Feeds the console's line parser, and runs what it accepts through the
 // console against the loaded module.
 #include <cstdint>
-#include <cstdio>
-#include <cstdlib>
-#include <sstream>
-#include <string>
-#include <vector>
+#include <cstring>
 
 #include "../tools/console.h"
 #include "../tools/log_capture.h"
@@ -15,29 +11,30 @@
 #include "fuzz_support.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, size_t size) {
-  const std::string line(reinterpret_cast<const char*>(bytes), size);
-  std::vector<ScriptWord> words;
-  std::string error;
-  if (splitScriptLine(line, words, error)) {
-    for (const ScriptWord& word : words) {
-      require(word.text.find('\0') == std::string::npos, "a word holds a NUL byte");
-      if (word.kind != ScriptWord::String) continue;
+  const char* line = reinterpret_cast<const char*>(bytes);
+  TArray<ScriptWord> words;
+  HString error;
+  if (splitScriptLine(line, size, words, error)) {
+    for (int i = 0; i < words.count(); ++i) {
+      if (words[i].kind != ScriptWord::String) continue;
       // A string written back in script syntax reads as the same string.
-      std::vector<ScriptWord> again;
-      std::string againError;
-      require(splitScriptLine(quoteScriptString(word.text), again, againError) &&
-                  again.size() == 1 && again[0].kind == ScriptWord::String &&
-                  again[0].text == word.text,
+      OutputStream quoted;
+      writeScriptString(quoted, words[i].text, size % 2 == 0);
+      TArray<ScriptWord> again;
+      require(splitScriptLine(quoted.text(), quoted.size(), again, error) && again.count() == 1 &&
+                  again[0].kind == ScriptWord::String &&
+                  std::strcmp(again[0].text, words[i].text) == 0,
               "a quoted string does not read back");
     }
   } else {
-    require(!error.empty(), "a refused line has a reason");
+    require(!error.IsEmpty(), "a refused line has a reason");
   }
 
-  std::ostringstream out;
-  std::ostringstream err;
-  LogCapture quiet;
-  Console console(sharedDefaultSession(), static_cast<ConsoleMode>(size % 3), out, err);
-  console.runLine(1, line);
+  OutputStream out;
+  OutputStream err;
+  TArray<LogEntry> quiet;
+  LogCapture capture(quiet);
+  Console console(sharedDefaultSession(), static_cast<ConsoleMode>(size % 3), out, err, "fuzz");
+  console.runLine(1, line, size);
   return 0;
 }

@@ -234,18 +234,31 @@ int HString::Replace(const char* oldText, const char* newText) {
   const char* text = GetStr();
   const size_t length = static_cast<size_t>(m_length);
 
-  std::string result;
-  int replaced = 0;
-  size_t from = 0;
-  for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
+  // Counting first refuses a result too long for a string before building any of it.
+  size_t replaced = 0;
+  for (size_t hit, from = 0; (hit = searcher.find(text, length, from)) != Searcher::npos;
        from = hit + oldLength) {
-    result.append(text + from, hit - from).append(replacement, newLength);
     ++replaced;
   }
   if (replaced == 0) return 0;
-  result.append(text + from, length - from);
-  assign(result.data(), result.size());
-  return replaced;
+  const size_t resultLength = length - replaced * oldLength + replaced * newLength;
+  if (resultLength > static_cast<size_t>(INT_MAX) - 1) throw std::bad_alloc();
+  char* result = new char[resultLength + 1];
+  char* out = result;
+  size_t from = 0;
+  for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
+       from = hit + oldLength) {
+    std::memcpy(out, text + from, hit - from);
+    out += hit - from;
+    std::memcpy(out, replacement, newLength);
+    out += newLength;
+  }
+  std::memcpy(out, text + from, length - from + 1);
+  delete[] m_data;
+  m_data = result;
+  m_length = static_cast<int>(resultLength);
+  m_capacity = m_length;
+  return static_cast<int>(replaced);
 }
 
 void HString::Format(const char* format, ...) {

@@ -3,41 +3,42 @@
 // against the expected outcome written beside each line.
 #pragma once
 
-#include <iosfwd>
-#include <string>
-#include <utility>
+#include <stddef.h>
 
+#include "output_stream.h"
 #include "plugin_session.h"
 
 enum class ConsoleMode { Plain, Json, Check };
 
 class Console {
  public:
-  // source names where the lines come from, in check reports.
-  Console(PluginSession& session, ConsoleMode mode, std::ostream& out, std::ostream& err,
-          std::string source = std::string())
-      : m_session(session), m_mode(mode), m_out(out), m_err(err), m_source(std::move(source)) {}
+  // Results go to out, messages to err; source names where the lines come
+  // from, in check reports.
+  Console(PluginSession& session, ConsoleMode mode, OutputStream& out, OutputStream& err,
+          const char* source)
+      : m_session(session), m_mode(mode), m_out(out), m_err(err), m_source(source) {}
 
-  // Runs one line (blank and comment lines are skipped and count as run).
-  // Returns false when the line was refused or execute returned false; in
-  // check mode, when its outcome differs from the one written beside it.
-  bool runLine(int lineNumber, const std::string& line);
+  // Runs one line of length bytes (blank and comment lines are skipped and
+  // count as run). Returns false when the line was refused, execute returned
+  // false or memory ran out; in check mode, when its outcome differs from
+  // the one written beside it.
+  bool runLine(int lineNumber, const char* line, size_t length);
+
+  // The plug-in's identity and every command's registration.
+  void list();
 
   // Check mode: how many cases ran, and how many of them differed.
   int casesRun() const { return m_casesRun; }
   int casesDiffering() const { return m_casesDiffering; }
 
-  // The plug-in's identity and every command's registration.
-  void list();
-
  private:
-  bool checkLine(int lineNumber, const std::string& line);
+  bool check(int lineNumber, const char* line, size_t length);
 
   PluginSession& m_session;
   ConsoleMode m_mode;
-  std::ostream& m_out;
-  std::ostream& m_err;
-  std::string m_source;
+  OutputStream& m_out;
+  OutputStream& m_err;
+  const char* m_source;
   int m_casesRun = 0;
   int m_casesDiffering = 0;
 };

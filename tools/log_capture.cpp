@@ -1,6 +1,6 @@
 #include "log_capture.h"
 
-LogCapture::LogCapture() {
+LogCapture::LogCapture(TArray<LogEntry>& entries) : m_entries(entries) {
   setLogSink(&LogCapture::receive, this);
 }
 
@@ -9,5 +9,8 @@ LogCapture::~LogCapture() {
 }
 
 void LogCapture::receive(LogLevel level, const char* message, void* context) {
-  static_cast<LogCapture*>(context)->m_entries.push_back(LogEntry{level, message});
+  LogEntry entry;
+  entry.level = level;
+  entry.message = message;
+  static_cast<LogCapture*>(context)->m_entries.add(entry);
 }

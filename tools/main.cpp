@@ -1,10 +1,8 @@
 // tavix-host: loads a command module through its exports and runs script
 // lines against its commands.
-#include <cstdio>
-#include <fstream>
-#include <iostream>
-#include <string>
-#include <vector>
+#include <errno.h>
+#include <stdio.h>
+#include <string.h>
 
 #if defined(_WIN32)
 #include <fcntl.h>
@@ -14,8 +12,12 @@
 #include <unistd.h>
 #endif
 
+#include "byte_buffer.h"
 #include "console.h"
+#include "line_reader.h"
+#include "output_stream.h"
 #include "plugin_session.h"
+#include "text_escape.h"
 
 namespace {
 
@@ -32,11 +34,11 @@ const char kUsage[] =
     "  --list         show the plug-in and its commands\n";
 
 struct Options {
-  std::string modulePath;
+  const char* modulePath = nullptr;
   ConsoleMode mode = ConsoleMode::Plain;
   bool list = false;
-  std::vector<std::string> lines;
-  std::string script;
+  TArray<const char*> lines;
+  const char* script = nullptr;
 };
 
 bool standardInputIsTerminal() {
@@ -48,53 +50,132 @@ bool standardInputIsTerminal() {
 #endif
 }
 
-int usageError(const std::string& message) {
-  std::cerr << "tavix-host: " << message << "\n" << kUsage;
+// Writes "tavix-host: " and the message on standard error, with the bytes
+// that do not print made visible; returns the exit status of a failed start.
+int fail(const char* message, const char* detail = "", const char* usage = "") {
+  OutputStream err(stderr);
+  err << "tavix-host: ";
+  writeMessageText(err, message);
+  writeMessageText(err, detail);
+  err << '\n' << usage;
+  return kUsageOrLoadError;
+}
+
+int usageError(const char* message, const char* detail = "") {
+  return fail(message, detail, kUsage);
+}
+
+// "cannot read NAME: reason" and the like.
+int failure(const char* what, const char* name, const char* reason) {
+  OutputStream err(stderr);
+  err << "tavix-host: " << what << ' ';
+  writeMessageText(err, name);
+  err << ": " << reason << '\n';
   return kUsageOrLoadError;
 }
 
 // Parses the command line; returns -1 when the run goes on, else the exit status.
 int parseOptions(int argc, char** argv, Options& options) {
   for (int i = 1; i < argc; ++i) {
-    const std::string arg = argv[i];
-    if (arg == "--help" || arg == "-h") {
-      std::cout << kUsage;
-      return kAllRan;
-    } else if (arg == "--json" || arg == "--check") {
+    const char* arg = argv[i];
+    if (strcmp(arg, "--help") == 0 || strcmp(arg, "-h") == 0) {
+      fputs(kUsage, stdout);
+      return fflush(stdout) == 0 ? kAllRan : kUsageOrLoadError;
+    } else if (strcmp(arg, "--json") == 0 || strcmp(arg, "--check") == 0) {
       if (options.mode != ConsoleMode::Plain) return usageError("give one of --json and --check");
-      options.mode = arg == "--json" ? ConsoleMode::Json : ConsoleMode::Check;
-    } else if (arg == "--list") {
+      options.mode = strcmp(arg, "--json") == 0 ? ConsoleMode::Json : ConsoleMode::Check;
+    } else if (strcmp(arg, "--list") == 0) {
       options.list = true;
-    } else if (arg == "--module" || arg == "-e") {
-      if (i + 1 == argc) return usageError(arg + " needs a value");
-      (arg == "-e" ? options.lines.emplace_back() : options.modulePath) = argv[++i];
-    } else if (!arg.empty() && arg[0] == '-' && arg != "-") {
-      return usageError("unknown option " + arg);
-    } else if (options.script.empty()) {
+    } else if (strcmp(arg, "--module") == 0 || strcmp(arg, "-e") == 0) {
+      if (i + 1 == argc) return usageError(arg, " needs a value");
+      if (arg[1] == 'e') {
+        options.lines.add(argv[++i]);
+      } else {
+        options.modulePath = argv[++i];
+      }
+    } else if (arg[0] == '-' && arg[1] != '\0') {
+      return usageError("unknown option ", arg);
+    } else if (options.script == nullptr) {
       options.script = arg;
     } else {
       return usageError("more than one script given");
     }
   }
-  if (!options.script.empty() && !options.lines.empty()) {
+  if (options.script != nullptr && options.lines.count() > 0) {
     return usageError("give either -e lines or a script, not both");
   }
-  if (options.modulePath.empty()) options.modulePath = defaultModulePath();
   return -1;
 }
 
-// Runs every line of in; the prompt is shown before each line when given.
-bool runStream(Console& console, std::istream& in, const char* prompt) {
+// Runs every line of reader; the prompt is shown before each line when given.
+// Stops early when standard output fails.
+bool runLines(Console& console, LineReader& reader, OutputStream& out, const char* prompt) {
   bool allOk = true;
-  std::string line;
-  int lineNumber = 0;
-  while (true) {
-    if (prompt != nullptr) std::cout << prompt << std::flush;
-    if (!std::getline(in, line)) break;
-    allOk = console.runLine(++lineNumber, line) && allOk;
+  ByteBuffer line;
+  for (int lineNumber = 1;; ++lineNumber) {
+    if (prompt != nullptr) {
+      out << prompt;
+      out.flush();
+    }
+    if (!reader.next(line)) break;
+    allOk = console.runLine(lineNumber, line.data(), line.size()) && allOk;
+    if (out.failure() != nullptr) break;
   }
-  if (prompt != nullptr) std::cout << "\n";
+  if (prompt != nullptr) out << '\n';
   return allOk;
+}
+
+int run(const Options& options) {
+  FILE* scriptFile = stdin;
+  const bool fromScript = options.script != nullptr && strcmp(options.script, "-") != 0;
+  if (fromScript) {
+    scriptFile = fopen(options.script, "rb");
+    if (scriptFile == nullptr) return failure("cannot read", options.script, strerror(errno));
+  }
+  const char* source = options.lines.count() > 0 ? "-e"
+                       : fromScript              ? options.script
+                                                 : "standard input";
+
+  HString error;
+  const HString modulePath =
+      options.modulePath != nullptr ? HString(options.modulePath) : defaultModulePath();
+  PluginSession* session = PluginSession::open(modulePath, error);
+  if (session == nullptr) {
+    if (fromScript) fclose(scriptFile);
+    return fail(error);
+  }
+
+  OutputStream out(stdout);
+  OutputStream err(stderr);
+  Console console(*session, options.mode, out, err, source);
+  LineReader reader(scriptFile);
+  bool allOk = true;
+  if (options.list) console.list();
+  if (options.list && options.lines.count() == 0 && options.script == nullptr) {
+    // --list alone lists and ends.
+  } else if (options.lines.count() > 0) {
+    for (int i = 0; i < options.lines.count() && out.failure() == nullptr; ++i) {
+      const char* line = options.lines[i];
+      allOk = console.runLine(i + 1, line, strlen(line)) && allOk;
+    }
+  } else {
+    const bool interactive = !fromScript && standardInputIsTerminal();
+    allOk = runLines(console, reader, out, interactive ? "tavix> " : nullptr);
+  }
+  if (options.mode == ConsoleMode::Check) {
+    out << source << ": ";
+    if (console.casesDiffering() == 0) {
+      out << console.casesRun() << " cases as expected\n";
+    } else {
+      out << console.casesDiffering() << " of " << console.casesRun() << " cases differ\n";
+    }
+  }
+  out.flush();
+  delete session;
+  if (fromScript) fclose(scriptFile);
+  if (out.failure() != nullptr) return failure("cannot write", "standard output", out.failure());
+  if (reader.failure() != nullptr) return failure("cannot read", source, reader.failure());
+  return allOk ? kAllRan : kSomeFailed;
 }
 
 }  // namespace
@@ -104,49 +185,9 @@ int main(int argc, char** argv) {
   // Byte-for-byte the same output as on other systems: no CR before each LF.
   _setmode(_fileno(stdout), _O_BINARY);
   _setmode(_fileno(stderr), _O_BINARY);
+  _setmode(_fileno(stdin), _O_BINARY);
 #endif
   Options options;
   const int status = parseOptions(argc, argv, options);
-  if (status >= 0) return status;
-
-  std::ifstream script;
-  if (!options.script.empty() && options.script != "-") {
-    script.open(options.script, std::ios::binary);
-    if (!script) return usageError("cannot read " + options.script);
-  }
-
-  std::string error;
-  std::unique_ptr<PluginSession> session = PluginSession::open(options.modulePath, error);
-  if (!session) {
-    std::cerr << "tavix-host: " << error << "\n";
-    return kUsageOrLoadError;
-  }
-
-  const std::string source = !options.lines.empty() ? "-e"
-                             : script.is_open()     ? options.script
-                                                    : "standard input";
-  Console console(*session, options.mode, std::cout, std::cerr, source);
-  if (options.list) {
-    console.list();
-    if (options.lines.empty() && options.script.empty()) return kAllRan;
-  }
-  bool allOk = true;
-  if (!options.lines.empty()) {
-    for (size_t i = 0; i < options.lines.size(); ++i) {
-      allOk = console.runLine(static_cast<int>(i + 1), options.lines[i]) && allOk;
-    }
-  } else if (script.is_open()) {
-    allOk = runStream(console, script, nullptr);
-  } else {
-    allOk = runStream(console, std::cin, standardInputIsTerminal() ? "tavix> " : nullptr);
-  }
-  if (options.mode == ConsoleMode::Check) {
-    std::cout << source << ": ";
-    if (console.casesDiffering() == 0) {
-      std::cout << console.casesRun() << " cases as expected\n";
-    } else {
-      std::cout << console.casesDiffering() << " of " << console.casesRun() << " cases differ\n";
-    }
-  }
-  return allOk ? kAllRan : kSomeFailed;
+  return status >= 0 ? status : run(options);
 }

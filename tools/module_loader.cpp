@@ -1,5 +1,7 @@
 #include "module_loader.h"
 
+#include <string.h>
+
 #if defined(_WIN32)
 #include <windows.h>
 #else
@@ -7,17 +9,21 @@
 #include <unistd.h>
 #endif
 
-#include <vector>
-
 #if defined(_WIN32)
 
-std::unique_ptr<ModuleLibrary> ModuleLibrary::open(const std::string& path, std::string& error) {
-  HMODULE handle = LoadLibraryA(path.c_str());
+ModuleLibrary* ModuleLibrary::open(const char* path, HString& error) {
+  // A full path stops the system's search; the module's own imports are
+  // then looked for beside it first.
+  char full[MAX_PATH];
+  const DWORD length = GetFullPathNameA(path, MAX_PATH, full, nullptr);
+  HMODULE handle = length > 0 && length < MAX_PATH
+                       ? LoadLibraryExA(full, nullptr, LOAD_WITH_ALTERED_SEARCH_PATH)
+                       : nullptr;
   if (handle == nullptr) {
-    error = "cannot load " + path + " (error " + std::to_string(GetLastError()) + ")";
+    error.Format("cannot load %s (error %lu)", path, GetLastError());
     return nullptr;
   }
-  return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(handle));
+  return new ModuleLibrary(handle);
 }
 
 ModuleLibrary::~ModuleLibrary() {
@@ -28,24 +34,31 @@ void* ModuleLibrary::symbol(const char* name) const {
   return reinterpret_cast<void*>(GetProcAddress(static_cast<HMODULE>(m_handle), name));
 }
 
-std::string executableDirectory() {
-  std::vector<char> path(32768);
-  const DWORD length = GetModuleFileNameA(nullptr, path.data(), static_cast<DWORD>(path.size()));
-  std::string full(path.data(), length);
-  const size_t slash = full.find_last_of("\\/");
-  return slash == std::string::npos ? std::string() : full.substr(0, slash + 1);
+HString executableDirectory() {
+  char path[MAX_PATH];
+  const DWORD length = GetModuleFileNameA(nullptr, path, MAX_PATH);
+  if (length == 0 || length >= MAX_PATH) return HString();
+  path[length] = '\0';
+  char* slash = strrchr(path, '\\');
+  if (slash == nullptr) return HString();
+  slash[1] = '\0';
+  return HString(path);
 }
 
 #else
 
-std::unique_ptr<ModuleLibrary> ModuleLibrary::open(const std::string& path, std::string& error) {
-  void* handle = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL);
+ModuleLibrary* ModuleLibrary::open(const char* path, HString& error) {
+  // dlopen searches the library path for a name without a slash; "./" keeps
+  // a bare name in the current folder.
+  HString file;
+  file.Format(strchr(path, '/') == nullptr ? "./%s" : "%s", path);
+  void* handle = dlopen(file.GetStr(), RTLD_NOW | RTLD_LOCAL);
   if (handle == nullptr) {
     const char* reason = dlerror();
-    error = "cannot load " + path + ": " + (reason != nullptr ? reason : "unknown error");
+    error.Format("cannot load %s: %s", path, reason != nullptr ? reason : "unknown error");
     return nullptr;
   }
-  return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(handle));
+  return new ModuleLibrary(handle);
 }
 
 ModuleLibrary::~ModuleLibrary() {
@@ -56,13 +69,15 @@ void* ModuleLibrary::symbol(const char* name) const {
   return dlsym(m_handle, name);
 }
 
-std::string executableDirectory() {
-  std::vector<char> path(4096);
-  const ssize_t length = readlink("/proc/self/exe", path.data(), path.size() - 1);
-  if (length <= 0) return std::string();
-  std::string full(path.data(), static_cast<size_t>(length));
-  const size_t slash = full.find_last_of('/');
-  return slash == std::string::npos ? std::string() : full.substr(0, slash + 1);
+HString executableDirectory() {
+  char path[4096];
+  const ssize_t length = readlink("/proc/self/exe", path, sizeof(path) - 1);
+  if (length <= 0) return HString();
+  path[length] = '\0';
+  char* slash = strrchr(path, '/');
+  if (slash == nullptr) return HString();
+  slash[1] = '\0';
+  return HString(path);
 }
 
 #endif

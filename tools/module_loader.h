@@ -2,13 +2,14 @@
 // LoadLibrary/GetProcAddress on Windows.
 #pragma once
 
-#include <memory>
-#include <string>
+#include "../host/hstring.h"
 
 class ModuleLibrary {
  public:
-  // The loaded library, or null with a one-line reason in error.
-  static std::unique_ptr<ModuleLibrary> open(const std::string& path, std::string& error);
+  // The library at path, a file path: a bare name is a file in the current
+  // folder, never one found on the system's library search path. Null with a
+  // one-line reason in error when it cannot be loaded. The caller deletes it.
+  static ModuleLibrary* open(const char* path, HString& error);
   ~ModuleLibrary();
   ModuleLibrary(const ModuleLibrary&) = delete;
   ModuleLibrary& operator=(const ModuleLibrary&) = delete;
@@ -27,4 +28,4 @@ class ModuleLibrary {
 };
 
 // The folder of the running executable, with a trailing separator.
-std::string executableDirectory();
+HString executableDirectory();

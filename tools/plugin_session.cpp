@@ -1,8 +1,10 @@
 #include "plugin_session.h"
 
-#include <cstdio>
-#include <cstdlib>
-#include <exception>
+#include <stdio.h>
+#include <stdlib.h>
+#include <string.h>
+
+#include "../host/out_of_memory.h"
 
 #include "../host/plugin_exports.h"
 
@@ -12,83 +14,96 @@ const char kModuleFileName[] = "TavixStringCmds.hll";
 
 }  // namespace
 
-std::string defaultModulePath() {
-  return executableDirectory() + kModuleFileName;
+HString defaultModulePath() {
+  HString path;
+  path.Format("%s%s", executableDirectory().GetStr(), kModuleFileName);
+  return path;
 }
 
-PluginSession& sharedDefaultSession() {
-  static PluginSession* session = [] {
-    std::string error;
-    PluginSession* opened = PluginSession::open(defaultModulePath(), error).release();
-    if (opened == nullptr) {
-      std::fprintf(stderr, "%s\n", error.c_str());
-      std::exit(2);
-    }
-    return opened;
-  }();
-  return *session;
-}
-
-std::unique_ptr<PluginSession> PluginSession::open(const std::string& path, std::string& error) {
-  std::unique_ptr<PluginSession> session(new PluginSession());
-  session->m_library = ModuleLibrary::open(path, error);
-  if (!session->m_library) return nullptr;
-
-  const auto apiVersion = session->m_library->function<ApiVersionFn>("apiVersion");
-  const auto getNumPlugins = session->m_library->function<GetNumPluginsFn>("getNumPlugins");
-  const auto getPlugin = session->m_library->function<GetPluginFn>("getPlugin");
-  for (const auto& [name, found] :
-       {std::pair<const char*, bool>{"apiVersion", apiVersion != nullptr},
-        {"getNumPlugins", getNumPlugins != nullptr},
-        {"getPlugin", getPlugin != nullptr}}) {
-    if (!found) {
-      error = path + " does not export " + name;
-      return nullptr;
-    }
+PluginSession* PluginSession::open(const char* path, HString& error) {
+  PluginSession* session = nullptr;
+  bool loaded = false;
+  try {
+    session = new PluginSession();
+    loaded = session->load(path, error);
+  } catch (const char* message) {  // E1224 from the module
+    error.Format("%s: initialize failed: %s", path, message);
+  } catch (const OutOfMemory&) {
+    error.Format("%s: out of memory", path);
   }
-  session->m_apiVersion = apiVersion();
-  if (session->m_apiVersion != kPluginApiVersion) {
-    error = path + " has interface version " + std::to_string(session->m_apiVersion) +
-            ", expected " + std::to_string(kPluginApiVersion);
-    return nullptr;
+  if (loaded) return session;
+  delete session;
+  return nullptr;
+}
+
+bool PluginSession::load(const char* path, HString& error) {
+  m_library = ModuleLibrary::open(path, error);
+  if (m_library == nullptr) return false;
+  const auto apiVersion = m_library->function<ApiVersionFn>("apiVersion");
+  const auto getNumPlugins = m_library->function<GetNumPluginsFn>("getNumPlugins");
+  const auto getPlugin = m_library->function<GetPluginFn>("getPlugin");
+  const char* missing = apiVersion == nullptr      ? "apiVersion"
+                        : getNumPlugins == nullptr ? "getNumPlugins"
+                        : getPlugin == nullptr     ? "getPlugin"
+                                                   : nullptr;
+  if (missing != nullptr) {
+    error.Format("%s does not export %s", path, missing);
+    return false;
+  }
+  m_apiVersion = apiVersion();
+  if (m_apiVersion != kPluginApiVersion) {
+    error.Format("%s has interface version %d, expected %d", path, m_apiVersion, kPluginApiVersion);
+    return false;
   }
   if (getNumPlugins() < 1) {
-    error = path + " holds no plug-in";
-    return nullptr;
+    error.Format("%s holds no plug-in", path);
+    return false;
   }
-  session->m_plugin = getPlugin(0);
-  if (session->m_plugin == nullptr) {
-    error = path + " gave no plug-in for index 0";
-    return nullptr;
-  }
-  std::string failure;
-  try {
-    session->m_plugin->initialize();
-  } catch (const char* message) {
-    failure = message;
-  } catch (const std::exception& exception) {
-    failure = exception.what();
+  m_plugin = getPlugin(0);
+  if (m_plugin == nullptr) {
+    error.Format("%s gave no plug-in for index 0", path);
+    return false;
   }
   // Whatever initialize created is released with the session, also after a failure.
-  for (int i = 0; i < session->m_plugin->getNumCommands(); ++i) {
-    Command* command = session->m_plugin->getCommand(i);
-    if (command != nullptr) session->m_commands.push_back(command);
+  try {
+    m_plugin->initialize();
+  } catch (...) {
+    adoptCommands();
+    throw;
   }
-  if (!failure.empty()) {
-    error = path + ": initialize failed: " + failure;
-    return nullptr;
+  adoptCommands();
+  return true;
+}
+
+void PluginSession::adoptCommands() {
+  for (int i = 0; i < m_plugin->getNumCommands(); ++i) {
+    Command* command = m_plugin->getCommand(i);
+    if (command != nullptr) m_commands.add(command);
   }
-  return session;
 }
 
 PluginSession::~PluginSession() {
   if (m_plugin != nullptr) m_plugin->deleteThis();
-  for (Command* command : m_commands) command->deleteThis();
+  for (int i = 0; i < m_commands.count(); ++i) m_commands[i]->deleteThis();
+  delete m_library;
 }
 
-Command* PluginSession::find(const std::string& name) const {
-  for (Command* command : m_commands) {
-    if (name == command->getName()) return command;
+Command* PluginSession::find(const char* name) const {
+  for (int i = 0; i < m_commands.count(); ++i) {
+    if (strcmp(name, m_commands[i]->getName()) == 0) return m_commands[i];
   }
   return nullptr;
+}
+
+PluginSession& sharedDefaultSession() {
+  static PluginSession* session = [] {
+    HString error;
+    PluginSession* opened = PluginSession::open(defaultModulePath().GetStr(), error);
+    if (opened == nullptr) {
+      fprintf(stderr, "%s\n", error.GetStr());
+      exit(2);
+    }
+    return opened;
+  }();
+  return *session;
 }

@@ -4,43 +4,43 @@
 // deleteThis, then unloads the library.
 #pragma once
 
-#include <memory>
-#include <string>
-#include <vector>
-
 #include "../host/command.h"
+#include "../host/hstring.h"
 #include "../host/plugin_base.h"
+#include "../host/tarray.h"
 #include "module_loader.h"
 
 // The module file built beside the running executable.
-std::string defaultModulePath();
-
-class PluginSession;
-
-// The module beside the running executable, loaded on first use and kept
-// for the whole run; the program stops with the reason if it cannot load.
-PluginSession& sharedDefaultSession();
+HString defaultModulePath();
 
 class PluginSession {
  public:
   // Loads path, checks apiVersion and getNumPlugins, creates the plug-in and
-  // its commands. Null with a one-line reason in error on any failure.
-  static std::unique_ptr<PluginSession> open(const std::string& path, std::string& error);
+  // its commands. Null with a one-line reason in error on any failure,
+  // running out of memory included. The caller deletes the session.
+  static PluginSession* open(const char* path, HString& error);
   ~PluginSession();
   PluginSession(const PluginSession&) = delete;
   PluginSession& operator=(const PluginSession&) = delete;
 
   CommandPluginBase& plugin() { return *m_plugin; }
   int apiVersion() const { return m_apiVersion; }
-  const std::vector<Command*>& commands() const { return m_commands; }
+  int commandCount() const { return m_commands.count(); }
+  Command& command(int index) const { return *m_commands[index]; }
   // The command of that script name, or null.
-  Command* find(const std::string& name) const;
+  Command* find(const char* name) const;
 
  private:
   PluginSession() = default;
+  bool load(const char* path, HString& error);
+  void adoptCommands();
 
-  std::unique_ptr<ModuleLibrary> m_library;
+  ModuleLibrary* m_library = nullptr;
   CommandPluginBase* m_plugin = nullptr;
   int m_apiVersion = 0;
-  std::vector<Command*> m_commands;
+  TArray<Command*> m_commands;
 };
+
+// The module beside the running executable, loaded on first use and kept
+// for the whole run; the program stops with the reason if it cannot load.
+PluginSession& sharedDefaultSession();

@@ -1,9 +1,11 @@
 #include "script_line.h"
 
-#include <cctype>
-#include <cerrno>
-#include <climits>
-#include <cstdlib>
+#include <errno.h>
+#include <limits.h>
+#include <stdlib.h>
+#include <string.h>
+
+#include "byte_buffer.h"
 
 namespace {
 
@@ -18,132 +20,142 @@ int hexDigit(char c) {
   return -1;
 }
 
-// Reads a quoted word starting at line[pos] == '"'; pos ends after the closing quote.
-bool readQuoted(const std::string& line, size_t& pos, std::string& text, std::string& error) {
-  for (++pos; pos < line.size(); ++pos) {
-    const char c = line[pos];
-    if (c == '"') {
+// The character an escape letter stands for, or NUL for none.
+char escapedCharacter(char letter) {
+  switch (letter) {
+    case '"':
+      return '"';
+    case '\\':
+      return '\\';
+    case 't':
+      return '\t';
+    case 'n':
+      return '\n';
+    case 'r':
+      return '\r';
+    default:
+      return '\0';
+  }
+}
+
+// Reads a quoted word from line[pos] == '"' into text; pos ends after the
+// closing quote. Runs without escapes are copied whole.
+bool readQuoted(const char* line, size_t length, size_t& pos, ByteBuffer& text, HString& error) {
+  for (++pos; pos < length;) {
+    size_t run = pos;
+    while (run < length && line[run] != '"' && line[run] != '\\') ++run;
+    text.append(line + pos, run - pos);
+    pos = run;
+    if (pos == length) break;
+    if (line[pos] == '"') {
       ++pos;
-      if (pos < line.size() && !isBlank(line[pos])) {
+      if (pos < length && !isBlank(line[pos])) {
         error = "a blank must follow a closing quote";
         return false;
       }
       return true;
     }
-    if (c != '\\') {
-      text += c;
-      continue;
-    }
-    if (++pos == line.size()) break;
-    switch (line[pos]) {
-      case '"':
-        text += '"';
-        break;
-      case '\\':
-        text += '\\';
-        break;
-      case 't':
-        text += '\t';
-        break;
-      case 'n':
-        text += '\n';
-        break;
-      case 'r':
-        text += '\r';
-        break;
-      case 'x': {
-        const int high = pos + 1 < line.size() ? hexDigit(line[pos + 1]) : -1;
-        const int low = pos + 2 < line.size() ? hexDigit(line[pos + 2]) : -1;
-        if (high < 0 || low < 0) {
-          error = "\\x needs two hex digits";
-          return false;
-        }
-        if (high == 0 && low == 0) {
-          error = "a string cannot hold a NUL byte";
-          return false;
-        }
-        text += static_cast<char>(high * 16 + low);
-        pos += 2;
-        break;
-      }
-      default:
-        error = std::string("unknown escape \\") + line[pos];
+    if (++pos == length) break;
+    const char letter = line[pos++];
+    if (escapedCharacter(letter) != '\0') {
+      text.append(escapedCharacter(letter));
+    } else if (letter == 'x') {
+      const int high = pos < length ? hexDigit(line[pos]) : -1;
+      const int low = pos + 1 < length ? hexDigit(line[pos + 1]) : -1;
+      if (high < 0 || low < 0) {
+        error = "\\x needs two hex digits";
         return false;
+      }
+      if (high == 0 && low == 0) {
+        error = "a string cannot hold a NUL byte";
+        return false;
+      }
+      text.append(static_cast<char>(high * 16 + low));
+      pos += 2;
+    } else {
+      error.Format("unknown escape \\%c", letter);
+      return false;
     }
   }
   error = "unterminated string";
   return false;
 }
 
-bool isDecimalInteger(const std::string& word) {
-  const size_t digits = (!word.empty() && word[0] == '-') ? 1 : 0;
-  if (word.size() == digits) return false;
-  for (size_t i = digits; i < word.size(); ++i) {
-    if (!std::isdigit(static_cast<unsigned char>(word[i]))) return false;
+bool isDecimalInteger(const char* word, size_t length) {
+  const size_t digits = (length > 0 && word[0] == '-') ? 1 : 0;
+  if (length == digits) return false;
+  for (size_t i = digits; i < length; ++i) {
+    if (word[i] < '0' || word[i] > '9') return false;
   }
   return true;
 }
 
+bool isLetter(char c) {
+  return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
+}
+
 }  // namespace
 
-bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, std::string& error) {
-  words.clear();
-  if (line.find('\0') != std::string::npos) {
+bool splitScriptLine(const char* line, size_t length, TArray<ScriptWord>& words, HString& error) {
+  words.removeAll();
+  if (memchr(line, '\0', length) != nullptr) {
     error = "a line cannot hold a NUL byte";
     return false;
   }
-  size_t pos = 0;
-  while (true) {
-    while (pos < line.size() && isBlank(line[pos])) ++pos;
-    if (pos == line.size() || line[pos] == '#') return true;  // the rest is a comment
+  ByteBuffer text;
+  for (size_t pos = 0;;) {
+    while (pos < length && isBlank(line[pos])) ++pos;
+    if (pos == length || line[pos] == '#') return true;  // the rest is a comment
+    ScriptWord word;
+    text.clear();
     if (line[pos] == '"') {
-      ScriptWord word{ScriptWord::String, std::string(), 0};
-      if (!readQuoted(line, pos, word.text, error)) return false;
-      words.push_back(word);
+      if (!readQuoted(line, length, pos, text, error)) return false;
+      word.text = text.data();
+      words.add(word);
       continue;
     }
     const size_t start = pos;
-    while (pos < line.size() && !isBlank(line[pos])) ++pos;
-    const std::string bare = line.substr(start, pos - start);
-    if (isDecimalInteger(bare)) {
+    while (pos < length && !isBlank(line[pos])) ++pos;
+    text.append(line + start, pos - start);
+    word.text = text.data();
+    if (isDecimalInteger(text.data(), text.size())) {
       errno = 0;
-      const long long value = std::strtoll(bare.c_str(), nullptr, 10);
+      const long long value = strtoll(text.data(), nullptr, 10);
       if (errno == ERANGE || value < INT_MIN || value > INT_MAX) {
-        error = "integer out of range: " + bare;
+        error.Format("integer out of range: %s", text.data());
         return false;
       }
-      words.push_back(ScriptWord{ScriptWord::Integer, bare, static_cast<int>(value)});
-    } else if (bare.size() > 1 && bare[0] == '-' &&
-               std::isalpha(static_cast<unsigned char>(bare[1]))) {
-      words.push_back(ScriptWord{ScriptWord::Option, bare.substr(1), 0});
-    } else {
-      words.push_back(ScriptWord{ScriptWord::String, bare, 0});
+      word.kind = ScriptWord::Integer;
+      word.number = static_cast<int>(value);
+    } else if (text.size() > 1 && text.data()[0] == '-' && isLetter(text.data()[1])) {
+      word.kind = ScriptWord::Option;
     }
+    words.add(word);
   }
 }
 
-bool splitExpectation(const std::string& line, std::string& caseText, std::string& expected) {
-  for (size_t at = line.rfind('#'); at != std::string::npos; at = line.rfind('#', at - 1)) {
+bool splitExpectation(const char* line, size_t length, size_t& caseLength, HString& expected) {
+  for (size_t at = length; at-- > 0;) {
+    if (line[at] != '#' || (at > 0 && !isBlank(line[at - 1]))) continue;
     size_t pos = at + 1;
-    while (pos < line.size() && isBlank(line[pos])) ++pos;
-    if ((at == 0 || isBlank(line[at - 1])) && line.compare(pos, 2, "=>") == 0) {
-      caseText = line.substr(0, at);
-      pos += 2;
-      size_t end = line.size();
-      while (pos < end && isBlank(line[pos])) ++pos;
-      while (end > pos && isBlank(line[end - 1])) --end;
-      expected = line.substr(pos, end - pos);
-      return true;
-    }
-    if (at == 0) break;
+    while (pos < length && isBlank(line[pos])) ++pos;
+    if (length - pos < 2 || line[pos] != '=' || line[pos + 1] != '>') continue;
+    size_t end = length;
+    for (pos += 2; pos < end && isBlank(line[pos]);) ++pos;
+    while (end > pos && isBlank(line[end - 1])) --end;
+    ByteBuffer note;
+    note.append(line + pos, end - pos);
+    expected = note.data();
+    caseLength = at;
+    return true;
   }
   return false;
 }
 
-bool isSkippedLine(const std::string& line) {
-  for (char c : line) {
-    if (isBlank(c)) continue;
-    return c == '#';
+bool isSkippedLine(const char* line, size_t length) {
+  for (size_t i = 0; i < length; ++i) {
+    if (isBlank(line[i])) continue;
+    return line[i] == '#';
   }
   return true;
 }

@@ -7,24 +7,26 @@
 // of the line.
 #pragma once
 
-#include <string>
-#include <vector>
+#include <stddef.h>
+
+#include "../host/hstring.h"
+#include "../host/tarray.h"
 
 struct ScriptWord {
   enum Kind { String, Integer, Option };
-  Kind kind;
-  std::string text;  // the string, the integer as written, or the option name without its dash
-  int number;        // the value of an Integer word
+  Kind kind = String;
+  HString text;    // the string; an integer or an option as written, its dash included
+  int number = 0;  // the value of an Integer word
 };
 
-// Splits a line into words. Returns false with a one-line reason on a bad
-// quote, escape or integer.
-bool splitScriptLine(const std::string& line, std::vector<ScriptWord>& words, std::string& error);
+// Splits a line of length bytes into words. Returns false with a one-line
+// reason on a bad quote, escape or integer, or a NUL byte anywhere.
+bool splitScriptLine(const char* line, size_t length, TArray<ScriptWord>& words, HString& error);
 
 // A script case: a line with its expected outcome beside it, after the last
-// "# =>" that begins a word. Splits it into the line to run and the expected
-// outcome (without surrounding blanks); false when the line has no such note.
-bool splitExpectation(const std::string& line, std::string& caseText, std::string& expected);
+// "# =>" that begins a word. Gives the length of the line to run and the
+// expected outcome (without surrounding blanks); false when there is no such note.
+bool splitExpectation(const char* line, size_t length, size_t& caseLength, HString& expected);
 
 // True for a line with nothing to run: blank, or a comment starting with #.
-bool isSkippedLine(const std::string& line);
+bool isSkippedLine(const char* line, size_t length);
