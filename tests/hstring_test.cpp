@@ -34,6 +34,7 @@ TEST(HStringTest, NullOperandsCountAsEmpty) {
   EXPECT_EQ(text.Replace(nullptr, "x"), 0);
   EXPECT_EQ(text.Replace("l", nullptr), 2);
   EXPECT_STREQ(text.GetStr(), "heo");
+  EXPECT_EQ(text.GetLength(), 3);
   EXPECT_STREQ(HString(nullptr).GetStr(), "");
 }
 

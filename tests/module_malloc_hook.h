@@ -3,8 +3,6 @@
 // see them. Other code keeps the real malloc.
 #pragma once
 
-#include <cstddef>
-
 class ModuleMallocHook {
  public:
   // Patches the module loaded from a file with this name (without folder).

@@ -1,0 +1,85 @@
+// The exceptions that cross the module's boundary, met as a host meets them:
+// E1224 thrown by the module when its command list cannot grow, caught as a
+// const char*, and the allocation exception thrown in TavixCore passing
+// through a command. Plain C++ without a test framework, so that it runs
+// wherever the module does.
+#include <stdio.h>
+#include <stdlib.h>
+#include <string.h>
+
+#include "../host/out_of_memory.h"
+#include "../host/plugin_exports.h"
+#include "../tools/module_loader.h"
+#include "../tools/plugin_session.h"
+#include "../tools/script_values.h"
+#include "module_malloc_hook.h"
+
+namespace {
+
+int g_failures = 0;
+
+void expect(bool holds, const char* what) {
+  printf("%s: %s\n", holds ? "ok" : "FAILED", what);
+  g_failures += holds ? 0 : 1;
+}
+
+// n copies of c.
+Variable repeated(char c, size_t n) {
+  char* text = static_cast<char*>(malloc(n + 1));
+  memset(text, c, n);
+  text[n] = '\0';
+  Variable value = stringValue(text);
+  free(text);
+  return value;
+}
+
+}  // namespace
+
+int main() {
+  HString error;
+  ModuleLibrary* library = ModuleLibrary::open(defaultModulePath(), error);
+  if (library == nullptr) {
+    printf("FAILED: %s\n", error.GetStr());
+    return 1;
+  }
+  CommandPluginBase* plugin = library->function<GetPluginFn>("getPlugin")(0);
+  plugin->initialize();  // 11 commands in 16 slots
+  {
+    ModuleMallocHook hook("TavixStringCmds.hll");
+    expect(hook.installed(), "the module's malloc import is found");
+    hook.failNextRequest();  // the 17th append must grow the list
+    const char* caught = nullptr;
+    try {
+      plugin->initialize();
+    } catch (const char* message) {
+      caught = message;
+    }
+    expect(
+        caught != nullptr && strcmp(caught, "E1224: Out of memory in TSimpleArray::addSpace") == 0,
+        "E1224 from the module is caught as const char*");
+  }
+  expect(plugin->getNumCommands() == 16, "the list keeps the 16 commands it held");
+  expect(strcmp(plugin->getCommand(15)->getName(), "strMid") == 0,
+         "the commands appended before the failure stay in order");
+
+  // A result past 2^31 bytes: the host string refuses it with the allocation exception.
+  TArray<Variable> args;
+  args.add(repeated('a', 46341));
+  args.add(stringValue("a"));
+  args.add(repeated('b', 46341));
+  bool caughtOutOfMemory = false;
+  try {
+    Variable result;
+    plugin->getCommand(5)->execute(TArray<CommandOption>(), args, result);
+  } catch (const OutOfMemory&) {
+    caughtOutOfMemory = true;
+  }
+  expect(caughtOutOfMemory, "the allocation exception from TavixCore passes through a command");
+
+  TArray<Command*> commands;
+  for (int i = 0; i < plugin->getNumCommands(); ++i) commands.add(plugin->getCommand(i));
+  plugin->deleteThis();
+  for (int i = 0; i < commands.count(); ++i) commands[i]->deleteThis();
+  delete library;
+  return g_failures == 0 ? 0 : 1;
+}
