@@ -1,6 +1,6 @@
 #include "command_frame.h"
 
-#include <cstdint>
+#include <stdint.h>
 
 void releaseCommand(Command& command) {
   command.unref();
@@ -24,11 +24,10 @@ void declareStringOption(Command& command, const char* name) {
                     false);
 }
 
-bool argumentsAre(const TArray<Variable>& args, std::initializer_list<Variable::VarType> expected) {
-  if (args.count() != static_cast<int>(expected.size())) return false;
-  int position = 0;
-  for (Variable::VarType type : expected) {
-    if (args[position++].getType() != type) return false;
+bool argumentsMatch(const TArray<Variable>& args, const Variable::VarType* expected, int count) {
+  if (args.count() != count) return false;
+  for (int i = 0; i < count; ++i) {
+    if (args[i].getType() != expected[i]) return false;
   }
   return true;
 }

@@ -2,8 +2,6 @@
 // the argument check and the walk over the options given.
 #pragma once
 
-#include <initializer_list>
-
 #include "../host/command.h"
 #include "../host/hstring.h"
 
@@ -21,9 +19,15 @@ void setCategory(Command& command, const char* category);
 void declareFlagOption(Command& command, const char* name);
 void declareStringOption(Command& command, const char* name);
 
-// True when args holds exactly one value of each expected type, in order.
+// True when args holds exactly count values, of the expected types in order.
 // The count is tested first, then the types from the first on.
-bool argumentsAre(const TArray<Variable>& args, std::initializer_list<Variable::VarType> expected);
+bool argumentsMatch(const TArray<Variable>& args, const Variable::VarType* expected, int count);
+
+// argumentsMatch for a list written in place: argumentsAre(args, {TypeString, TypeInt}).
+template <int Count>
+bool argumentsAre(const TArray<Variable>& args, const Variable::VarType (&expected)[Count]) {
+  return argumentsMatch(args, expected, Count);
+}
 
 // The declared-option index that a given option stands for, or -1 when it
 // names none of the command's declaredCount options (negative and

@@ -1,33 +1,32 @@
 #include "command.h"
 
-#include <cstring>
-#include <memory>
-#include <string>
-#include <vector>
+#include <string.h>
 
 #include "format_text.h"
 #include "log_sink.h"
 
 struct Command::Data {
+  Data(const HString& commandName, const HString& commandDescription, const HString& third)
+      : name(commandName), description(commandDescription), extra(third) {}
+  ~Data() {
+    for (int i = 0; i < options.count(); ++i) delete options[i];
+  }
+  Data(const Data&) = delete;
+  Data& operator=(const Data&) = delete;
+
   HString name;
   HString description;
   HString extra;
   HString category;
   HString subCategory;
-  std::vector<std::unique_ptr<CommandOption>> options;
+  TArray<CommandOption*> options;  // owned
   int references = 1;
 };
 
 const HRuntimeClass Command::s_classCommand = {"Command", &HObject::s_classHObject};
 
 Command::Command(const HString& name, const HString& description, const HString& extra)
-    : m_data(nullptr) {
-  std::unique_ptr<Data> data(new Data);
-  data->name = name;
-  data->description = description;
-  data->extra = extra;
-  m_data = data.release();
-}
+    : m_data(new Data(name, description, extra)) {}
 
 Command::~Command() {
   delete m_data;
@@ -56,9 +55,9 @@ Variable::VarType Command::getReturnType() const {
 
 int Command::getOptionSyntax(const char* name, int& index, Variable::VarType& type) const {
   if (name == nullptr) return 0;
-  for (size_t i = 0; i < m_data->options.size(); ++i) {
-    if (std::strcmp(m_data->options[i]->getName(), name) == 0) {
-      index = static_cast<int>(i);
+  for (int i = 0; i < m_data->options.count(); ++i) {
+    if (strcmp(m_data->options[i]->getName(), name) == 0) {
+      index = i;
       type = m_data->options[i]->getValueType();
       return 1;
     }
@@ -77,9 +76,13 @@ void Command::setCommandCategory(HString category, HString subCategory) {
 
 CommandOption* Command::addOption(CommandOption* option, size_t /*size*/, bool /*flag*/) {
   if (option == nullptr) return nullptr;
-  std::unique_ptr<CommandOption> owned(option);
-  owned->m_index = static_cast<int>(m_data->options.size());
-  m_data->options.push_back(std::move(owned));
+  option->m_index = m_data->options.count();
+  try {
+    m_data->options.add(option);
+  } catch (...) {
+    delete option;
+    throw;
+  }
   return option;
 }
 
@@ -118,10 +121,10 @@ const char* Command::getCategory() const {
 }
 
 int Command::getNumOptions() const {
-  return static_cast<int>(m_data->options.size());
+  return m_data->options.count();
 }
 
 const CommandOption* Command::getOption(int index) const {
   if (index < 0 || index >= getNumOptions()) return nullptr;
-  return m_data->options[static_cast<size_t>(index)].get();
+  return m_data->options[index];
 }

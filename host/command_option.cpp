@@ -1,18 +1,15 @@
 #include "command_option.h"
 
-#include <memory>
-
 CommandOption::CommandOption()
     : m_valueCount(0), m_valueType(Variable::TypeNone), m_flag(false), m_index(-1) {}
 
+CommandOption::CommandOption(const HString& name, int valueCount, Variable::VarType valueType,
+                             bool flag)
+    : m_name(name), m_valueCount(valueCount), m_valueType(valueType), m_flag(flag), m_index(-1) {}
+
 CommandOption* CommandOption::createInstance(const HString& name, int valueCount,
                                              Variable::VarType valueType, bool flag) {
-  std::unique_ptr<CommandOption> option(new CommandOption());
-  option->m_name = name;
-  option->m_valueCount = valueCount;
-  option->m_valueType = valueType;
-  option->m_flag = flag;
-  return option.release();
+  return new CommandOption(name, valueCount, valueType, flag);
 }
 
 CommandOption CommandOption::given(int declaredIndex, const Variable& value) {

@@ -27,6 +27,7 @@ class TAVIXCORE_API CommandOption {
 
  private:
   friend class Command;
+  CommandOption(const HString& name, int valueCount, Variable::VarType valueType, bool flag);
 
   HString m_name;
   int m_valueCount;

@@ -1,7 +1,6 @@
 #include "format_text.h"
 
-#include <cstdio>
-#include <vector>
+#include <stdio.h>
 
 void formatInto(HString& text, const char* format, va_list arguments) {
   // The arguments may point into text itself: it changes only at the end.
@@ -9,16 +8,19 @@ void formatInto(HString& text, const char* format, va_list arguments) {
   if (format != nullptr) {
     va_list measuring;
     va_copy(measuring, arguments);
-    needed = std::vsnprintf(nullptr, 0, format, measuring);
+    needed = vsnprintf(nullptr, 0, format, measuring);
     va_end(measuring);
   }
   if (needed <= 0) {
     text.Empty();
     return;
   }
-  std::vector<char> buffer(static_cast<size_t>(needed) + 1);
-  std::vsnprintf(buffer.data(), buffer.size(), format, arguments);
-  text = buffer.data();
+  struct Buffer {
+    char* bytes;
+    ~Buffer() { delete[] bytes; }
+  } buffer{new char[static_cast<size_t>(needed) + 1]};
+  vsnprintf(buffer.bytes, static_cast<size_t>(needed) + 1, format, arguments);
+  text = buffer.bytes;
 }
 
 void logFormatted(LogLevel level, const char* format, va_list arguments) {

@@ -1,21 +1,18 @@
 #include "hstring.h"
 
-#include "format_text.h"
+#include <limits.h>
+#include <stdarg.h>
+#include <string.h>
 
-#include <climits>
-#include <cstdarg>
-#include <cstdio>
-#include <cstring>
-#include <new>
-#include <string>
-#include <vector>
+#include "format_text.h"
+#include "out_of_memory.h"
 
 namespace {
 
 const char kEmptyText[] = "";
 
 size_t textLength(const char* text) {
-  return text == nullptr ? 0 : std::strlen(text);
+  return text == nullptr ? 0 : strlen(text);
 }
 
 // Finds one needle in texts in time linear in text and needle. Needles of up
@@ -26,9 +23,10 @@ class Searcher {
  public:
   static constexpr size_t kShortNeedle = 16;
 
-  Searcher(const char* needle, size_t length) : m_needle(needle), m_length(length) {
+  Searcher(const char* needle, size_t length)
+      : m_needle(needle), m_length(length), m_border(nullptr) {
     if (m_length <= kShortNeedle) return;
-    m_border.assign(m_length, 0);
+    m_border = new size_t[m_length]();
     size_t k = 0;
     for (size_t i = 1; i < m_length; ++i) {
       while (k > 0 && m_needle[i] != m_needle[k]) k = m_border[k - 1];
@@ -45,9 +43,9 @@ class Searcher {
       const char* last = text + (textLength - m_length);  // the last possible start
       for (const char* at = text + from; at <= last; ++at) {
         at = static_cast<const char*>(
-            std::memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
+            memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
         if (at == nullptr) return npos;
-        if (std::memcmp(at, m_needle, m_length) == 0) return static_cast<size_t>(at - text);
+        if (memcmp(at, m_needle, m_length) == 0) return static_cast<size_t>(at - text);
       }
       return npos;
     }
@@ -60,12 +58,16 @@ class Searcher {
     return npos;
   }
 
+  ~Searcher() { delete[] m_border; }
+  Searcher(const Searcher&) = delete;
+  Searcher& operator=(const Searcher&) = delete;
+
   static constexpr size_t npos = static_cast<size_t>(-1);
 
  private:
   const char* m_needle;
   size_t m_length;
-  std::vector<size_t> m_border;
+  size_t* m_border;  // Knuth-Morris-Pratt table, for long needles only
 };
 
 int foldAscii(unsigned char c) {
@@ -99,11 +101,11 @@ HString::~HString() {
 }
 
 void HString::assign(const char* text, size_t length) {
-  if (length > static_cast<size_t>(INT_MAX) - 1) throw std::bad_alloc();
+  if (length > static_cast<size_t>(INT_MAX) - 1) throw OutOfMemory();
   char* copy = nullptr;
   if (length > 0) {
     copy = new char[length + 1];
-    std::memcpy(copy, text, length);
+    memcpy(copy, text, length);
     copy[length] = '\0';
   }
   delete[] m_data;
@@ -151,7 +153,8 @@ char HString::operator[](int index) const {
 
 char& HString::operator[](int index) {
   if (index >= 0 && index < m_length) return m_data[index];
-  thread_local char scratch;
+  // One scratch byte for the whole host: commands run on the host's one thread.
+  static char scratch;
   scratch = '\0';
   return scratch;
 }
@@ -160,11 +163,11 @@ HString& HString::operator+=(char c) {
   if (c == '\0') return *this;
   if (m_length == m_capacity) {
     // Doubling keeps a run of appends linear in the final length.
-    if (m_length >= INT_MAX - 1) throw std::bad_alloc();
+    if (m_length >= INT_MAX - 1) throw OutOfMemory();
     const int capacity =
         m_capacity < 8 ? 8 : (m_capacity > INT_MAX / 2 - 1 ? INT_MAX - 1 : m_capacity * 2);
     char* grown = new char[static_cast<size_t>(capacity) + 1];
-    std::memcpy(grown, GetStr(), static_cast<size_t>(m_length));
+    memcpy(grown, GetStr(), static_cast<size_t>(m_length));
     delete[] m_data;
     m_data = grown;
     m_capacity = capacity;
@@ -190,7 +193,7 @@ int HString::Find(const char* sub, int start) const {
   if (start < 0) start = 0;
   if (start > m_length) return -1;
   const char* needle = sub == nullptr ? kEmptyText : sub;
-  const Searcher searcher(needle, std::strlen(needle));
+  const Searcher searcher(needle, strlen(needle));
   const size_t hit =
       searcher.find(GetStr(), static_cast<size_t>(m_length), static_cast<size_t>(start));
   return hit == Searcher::npos ? -1 : static_cast<int>(hit);
@@ -229,7 +232,7 @@ int HString::Replace(const char* oldText, const char* newText) {
   const size_t oldLength = textLength(oldText);
   if (oldLength == 0) return 0;
   const char* replacement = newText == nullptr ? kEmptyText : newText;
-  const size_t newLength = std::strlen(replacement);
+  const size_t newLength = strlen(replacement);
   const Searcher searcher(oldText, oldLength);
   const char* text = GetStr();
   const size_t length = static_cast<size_t>(m_length);
@@ -242,18 +245,18 @@ int HString::Replace(const char* oldText, const char* newText) {
   }
   if (replaced == 0) return 0;
   const size_t resultLength = length - replaced * oldLength + replaced * newLength;
-  if (resultLength > static_cast<size_t>(INT_MAX) - 1) throw std::bad_alloc();
+  if (resultLength > static_cast<size_t>(INT_MAX) - 1) throw OutOfMemory();
   char* result = new char[resultLength + 1];
   char* out = result;
   size_t from = 0;
   for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
        from = hit + oldLength) {
-    std::memcpy(out, text + from, hit - from);
+    memcpy(out, text + from, hit - from);
     out += hit - from;
-    std::memcpy(out, replacement, newLength);
+    memcpy(out, replacement, newLength);
     out += newLength;
   }
-  std::memcpy(out, text + from, length - from + 1);
+  memcpy(out, text + from, length - from + 1);
   delete[] m_data;
   m_data = result;
   m_length = static_cast<int>(resultLength);

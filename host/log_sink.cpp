@@ -1,6 +1,6 @@
 #include "log_sink.h"
 
-#include <cstdio>
+#include <stdio.h>
 
 namespace {
 
@@ -32,5 +32,5 @@ void logMessage(LogLevel level, const char* message) {
     g_sink(level, text, g_sinkContext);
     return;
   }
-  std::fprintf(stderr, "%s: %s\n", logLevelName(level), text);
+  fprintf(stderr, "%s: %s\n", logLevelName(level), text);
 }

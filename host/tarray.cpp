@@ -1,7 +1,7 @@
 #include "tarray.h"
 
-#include <new>
+#include "out_of_memory.h"
 
 void tarrayCapacityExhausted() {
-  throw std::bad_alloc();
+  throw OutOfMemory();
 }

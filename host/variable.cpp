@@ -1,14 +1,14 @@
 #include "variable.h"
 
-#include <cstring>
+#include <string.h>
 
 namespace {
 
 char* copyText(const char* text) {
   const char* source = text == nullptr ? "" : text;
-  const size_t length = std::strlen(source);
+  const size_t length = strlen(source);
   char* copy = new char[length + 1];
-  std::memcpy(copy, source, length + 1);
+  memcpy(copy, source, length + 1);
   return copy;
 }
 

@@ -1,7 +1,5 @@
 #include "string_commands_plugin.h"
 
-#include <memory>
-
 #include "../commands/compare_search.h"
 #include "../commands/substring.h"
 #include "../commands/test_print.h"
@@ -53,11 +51,13 @@ HString TavixStringCommandsPlugin::getReleaseString() {
 
 template <class CommandClass>
 void TavixStringCommandsPlugin::addCommand() {
-  // A command whose append fails is released again, not leaked.
-  std::unique_ptr<CommandClass, void (*)(CommandClass*)> command(
-      new CommandClass(), [](CommandClass* c) { c->deleteThis(); });
-  m_commands.add(command.get());
-  static_cast<void>(command.release());  // the list holds it now
+  CommandClass* command = new CommandClass();
+  try {
+    m_commands.add(command);
+  } catch (...) {
+    command->deleteThis();  // a command whose append fails is released again, not leaked
+    throw;
+  }
 }
 
 bool TavixStringCommandsPlugin::initialize() {
