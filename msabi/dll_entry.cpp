@@ -1,0 +1,11 @@
+// The entry point of a DLL: the static part of the Microsoft C++ runtime
+// that runs constructors on load and destructors on unload is not here.
+#include <windows.h>
+
+#include "startup.h"
+
+extern "C" BOOL WINAPI _DllMainCRTStartup(HINSTANCE, DWORD reason, LPVOID) {
+  if (reason == DLL_PROCESS_ATTACH) startModule();
+  if (reason == DLL_PROCESS_DETACH) finishModule();
+  return TRUE;
+}
