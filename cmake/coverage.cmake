@@ -18,4 +18,4 @@ add_custom_target(coverage
   WORKING_DIRECTORY ${CMAKE_BINARY_DIR}
   USES_TERMINAL
   VERBATIM)
-add_dependencies(coverage host_tests module_tests console_tests tavix-host TavixStringCmds)
+add_dependencies(coverage host_tests module_tests console_tests boundary_test tavix-host TavixStringCmds)
