@@ -47,7 +47,7 @@ int main() {
   {
     ModuleMallocHook hook("TavixStringCmds.hll");
     expect(hook.installed(), "the module's malloc import is found");
-    hook.failNextRequest();  // the 17th append must grow the list
+    hook.failNextRequestOf(32 * sizeof(Command*));  // the 17th append grows the list to 32
     const char* caught = nullptr;
     try {
       plugin->initialize();

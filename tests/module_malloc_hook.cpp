@@ -18,11 +18,11 @@ namespace {
 using MallocFn = void* (*)(size_t);
 
 MallocFn g_realMalloc = nullptr;
-bool g_failNext = false;
+size_t g_failingSize = 0;  // 0: none fails
 
 void* hookedMalloc(size_t bytes) {
-  if (g_failNext) {
-    g_failNext = false;
+  if (bytes == g_failingSize) {
+    g_failingSize = 0;
     return nullptr;
   }
   return g_realMalloc(bytes);
@@ -104,15 +104,15 @@ ModuleMallocHook::ModuleMallocHook(const char* moduleFileName) {
   m_slot = findMallocImport(moduleFileName);
   if (m_slot == nullptr) return;
   g_realMalloc = reinterpret_cast<MallocFn>(*m_slot);
-  g_failNext = false;
+  g_failingSize = 0;
   writeSlot(m_slot, reinterpret_cast<void*>(&hookedMalloc));
 }
 
 ModuleMallocHook::~ModuleMallocHook() {
   if (m_slot != nullptr) writeSlot(m_slot, reinterpret_cast<void*>(g_realMalloc));
-  g_failNext = false;
+  g_failingSize = 0;
 }
 
-void ModuleMallocHook::failNextRequest() {
-  g_failNext = true;
+void ModuleMallocHook::failNextRequestOf(size_t bytes) {
+  g_failingSize = bytes;
 }

@@ -3,6 +3,8 @@
 // see them. Other code keeps the real malloc.
 #pragma once
 
+#include <stddef.h>
+
 class ModuleMallocHook {
  public:
   // Patches the module loaded from a file with this name (without folder).
@@ -13,8 +15,10 @@ class ModuleMallocHook {
 
   // Whether the module's malloc import was found and redirected.
   bool installed() const { return m_slot != nullptr; }
-  // The module's next malloc returns null; later ones succeed again.
-  void failNextRequest();
+  // The module's next malloc of exactly this many bytes returns null; other
+  // requests, and later ones, succeed. (Where the module's operator new
+  // calls malloc through the same import, its requests pass here too.)
+  void failNextRequestOf(size_t bytes);
 
  private:
   void** m_slot = nullptr;

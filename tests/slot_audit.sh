@@ -5,11 +5,12 @@
 set -euo pipefail
 here=$(cd "$(dirname "$0")" && pwd)
 compiler=${CLANGXX:-clang++}
+mingw=${MINGW_INCLUDE:-/usr/x86_64-w64-mingw32/include}
 resource=$("$compiler" -print-resource-dir)
 
 dump=$("$compiler" -target x86_64-pc-windows-msvc -std=c++17 -fno-rtti -fgnuc-version=12 \
-  -nostdinc -isystem /usr/share/mingw-w64/include -isystem "$resource/include" \
-  -S -o /dev/null -Xclang -fdump-vtable-layouts "$here/slot_audit.cpp")
+  -nostdinc -isystem "$here/../msabi/include" -isystem "$resource/include" -isystem "$mingw" \
+  -D_UCRT -S -o /dev/null -Xclang -fdump-vtable-layouts "$here/slot_audit.cpp")
 
 # One line per slot: class, slot, the qualified operation (and "pure").
 actual=$(printf '%s\n' "$dump" | awk '

@@ -1,0 +1,27 @@
+# The Windows build's own tests, beside the script cases.
+
+# The module's binary interface: its export and import tables, and the
+# virtual table slots of the classes hosts call through.
+find_program(TAVIX_READOBJ NAMES llvm-readobj llvm-readobj-14 REQUIRED)
+add_test(NAME export_audit
+         COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh exports $<TARGET_FILE:TavixStringCmds>)
+add_test(NAME import_audit
+         COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh imports $<TARGET_FILE:TavixStringCmds>)
+set_tests_properties(export_audit import_audit PROPERTIES ENVIRONMENT "READOBJ=${TAVIX_READOBJ}")
+add_test(NAME slot_audit COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/slot_audit.sh)
+set_tests_properties(slot_audit PROPERTIES
+  ENVIRONMENT "CLANGXX=${CMAKE_CXX_COMPILER};MINGW_INCLUDE=${TAVIX_MINGW_ROOT}/include")
+
+# Every script case file prints, as JSON, byte for byte what the Linux console
+# prints. Skipped until the Linux console is built at TAVIX_LINUX_HOST.
+set(TAVIX_LINUX_HOST ${PROJECT_SOURCE_DIR}/build/default/bin/tavix-host
+    CACHE FILEPATH "The Linux console whose output the Windows one must match")
+foreach(case_file ${case_files})
+  get_filename_component(topic ${case_file} NAME_WE)
+  add_test(NAME same_as_linux.${topic}
+           COMMAND ${CMAKE_COMMAND} "-DCOMMAND=${host_command};--json;${case_file}"
+                   "-DEXPECTED_COMMAND=${TAVIX_LINUX_HOST};--json;${case_file}"
+                   -DACTUAL=${CMAKE_CURRENT_BINARY_DIR}/actual_${topic}.json
+                   -P ${PROJECT_SOURCE_DIR}/cmake/compare_output.cmake)
+  set_tests_properties(same_as_linux.${topic} PROPERTIES SKIP_REGULAR_EXPRESSION "not built yet")
+endforeach()
