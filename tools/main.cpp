@@ -28,7 +28,8 @@ constexpr int kUsageOrLoadError = 2;
 const char kUsage[] =
     "usage: tavix-host [--module PATH] [--json | --check] [--list] [-e LINE]... [SCRIPT]\n"
     "  Runs script lines from SCRIPT, from each -e LINE, or from standard input.\n"
-    "  --module PATH  the module to load (default: TavixStringCmds.hll beside tavix-host)\n"
+    "  --module PATH  the module to load (default: TavixStringCmds.hll beside tavix-host,\n"
+    "                 or in ../lib)\n"
     "  --json         one JSON object per executed line\n"
     "  --check        compare each line's outcome with the \"# => outcome\" beside it\n"
     "  --list         show the plug-in and its commands\n";

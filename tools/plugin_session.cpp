@@ -15,8 +15,15 @@ const char kModuleFileName[] = "TavixStringCmds.hll";
 }  // namespace
 
 HString defaultModulePath() {
+  // Beside the console in a build folder; in ../lib when installed.
+  const HString folder = executableDirectory();
   HString path;
-  path.Format("%s%s", executableDirectory().GetStr(), kModuleFileName);
+  path.Format("%s%s", folder.GetStr(), kModuleFileName);
+  if (FILE* file = fopen(path, "rb")) {
+    fclose(file);
+    return path;
+  }
+  path.Format("%s../lib/%s", folder.GetStr(), kModuleFileName);
   return path;
 }
 

@@ -10,7 +10,8 @@
 #include "../host/tarray.h"
 #include "module_loader.h"
 
-// The module file built beside the running executable.
+// The module file beside the running executable, or else in the lib folder
+// beside its bin folder, as an installed console finds it.
 HString defaultModulePath();
 
 class PluginSession {
