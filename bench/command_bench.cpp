@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "../host/log_sink.h"
+#include "../tools/console.h"
 #include "../tools/plugin_session.h"
 #include "../tools/script_values.h"
 
@@ -266,6 +267,34 @@ void BM_strTok_walk_scaling(benchmark::State& state, bool matchAll) {
   state.SetComplexityN(state.range(0));
   state.SetBytesProcessed(static_cast<int64_t>(state.iterations() * text.size()));
 }
+
+// --- end to end: a console line against the bare splitter ----------------
+
+constexpr int kConsoleTokens = 200000;
+
+// The console running `strTokArray -delims "," "tok0,tok1,..."` whole: reading
+// the line, calling the command, and writing the array as plain output.
+void BM_console_strTokArray(benchmark::State& state) {
+  const std::string line = "strTokArray -delims \",\" \"" + tokens(kConsoleTokens, ",") + "\"";
+  FILE* sink = std::fopen("/dev/null", "wb");
+  OutputStream out(sink);
+  OutputStream err(sink);
+  Console console(module(), ConsoleMode::Plain, out, err, "bench");
+  for (auto _ : state) console.runLine(1, line.data(), line.size());
+  out.flush();
+  std::fclose(sink);
+  state.SetBytesProcessed(static_cast<int64_t>(state.iterations() * line.size()));
+}
+
+// The same split by the bare C++ splitter, in this binary.
+void BM_bare_split_console_text(benchmark::State& state) {
+  const std::string text = tokens(kConsoleTokens, ",");
+  for (auto _ : state) benchmark::DoNotOptimize(splitView(text, ","));
+  state.SetBytesProcessed(static_cast<int64_t>(state.iterations() * text.size()));
+}
+
+BENCHMARK(BM_console_strTokArray)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_bare_split_console_text)->Unit(benchmark::kMillisecond);
 
 BENCHMARK_CAPTURE(BM_strTokArray_scaling, charSet, false)
     ->RangeMultiplier(10)
