@@ -42,8 +42,7 @@ class Searcher {
     if (m_length <= kShortNeedle) {
       const char* last = text + (textLength - m_length);  // the last possible start
       for (const char* at = text + from; at <= last; ++at) {
-        at = static_cast<const char*>(
-            memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
+        at = static_cast<const char*>(memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
         if (at == nullptr) return npos;
         if (memcmp(at, m_needle, m_length) == 0) return static_cast<size_t>(at - text);
       }
@@ -70,8 +69,18 @@ class Searcher {
   size_t* m_border;  // Knuth-Morris-Pratt table, for long needles only
 };
 
+// Each byte with A-Z folded to a-z, looked up rather than tested.
+struct FoldTable {
+  unsigned char folded[256];
+  constexpr FoldTable() : folded() {
+    for (int c = 0; c < 256; ++c)
+      folded[c] = static_cast<unsigned char>((c >= 'A' && c <= 'Z') ? c - 'A' + 'a' : c);
+  }
+};
+constexpr FoldTable kFold;
+
 int foldAscii(unsigned char c) {
-  return (c >= 'A' && c <= 'Z') ? c - 'A' + 'a' : c;
+  return kFold.folded[c];
 }
 
 template <class Fold>
@@ -86,36 +95,88 @@ int compareTexts(const char* left, const char* right, Fold fold) {
 
 }  // namespace
 
-HString::HString() : m_data(nullptr), m_length(0), m_capacity(0) {}
-
 HString::HString(const char* text) : HString() {
-  assign(text, textLength(text));
+  *this = text;
 }
 
 HString::HString(const HString& other) : HString() {
   assign(other.GetStr(), static_cast<size_t>(other.m_length));
 }
 
-HString::~HString() {
-  delete[] m_data;
+int HString::heapCapacity() const {
+  int capacity;
+  memcpy(&capacity, m_storage + sizeof(char*), sizeof(capacity));
+  return capacity;
+}
+
+void HString::setHeap(char* text, int capacity) {
+  memcpy(m_storage, &text, sizeof(text));
+  memcpy(m_storage + sizeof(char*), &capacity, sizeof(capacity));
+}
+
+char* HString::characters() {
+  return isInline() ? m_storage : heapText();
+}
+
+void HString::release() {
+  if (!isInline()) delete[] heapText();
+  m_length = 0;
+  m_storage[0] = '\0';
+}
+
+char* HString::prepare(size_t length) {
+  if (length > static_cast<size_t>(INT_MAX) - 1) throw OutOfMemory();
+  if (length <= kInlineLength) {
+    release();
+  } else if (isInline() || static_cast<size_t>(heapCapacity()) < length) {
+    char* text = new char[length + 1];
+    release();
+    setHeap(text, static_cast<int>(length));
+  }
+  m_length = static_cast<int>(length);
+  return characters();
 }
 
 void HString::assign(const char* text, size_t length) {
+  // text may lie inside this string: it is copied before anything is freed.
   if (length > static_cast<size_t>(INT_MAX) - 1) throw OutOfMemory();
-  char* copy = nullptr;
-  if (length > 0) {
-    copy = new char[length + 1];
+  if (text == nullptr) text = kEmptyText;
+  if (length <= kInlineLength) {
+    if (isInline()) {
+      // A short text is copied byte by byte: cheaper than a library call,
+      // and safe when it lies inside this string (it never starts before it).
+      for (size_t i = 0; i < length; ++i) m_storage[i] = text[i];
+    } else {
+      char* old = heapText();
+      memcpy(m_storage, text, length);
+      delete[] old;
+    }
+  } else if (!isInline() && length <= static_cast<size_t>(heapCapacity())) {
+    memmove(heapText(), text, length);
+  } else {
+    char* copy = new char[length + 1];
     memcpy(copy, text, length);
-    copy[length] = '\0';
+    release();
+    setHeap(copy, static_cast<int>(length));
   }
-  delete[] m_data;
-  m_data = copy;
   m_length = static_cast<int>(length);
-  m_capacity = m_length;
+  characters()[length] = '\0';
 }
 
 HString& HString::operator=(const char* text) {
-  if (text != m_data) assign(text, textLength(text));
+  if (text == nullptr) text = kEmptyText;
+  // A short text is measured while it is copied, in one pass; it goes to a
+  // buffer first, as it may lie inside this string.
+  char shortText[kInlineLength + 1];
+  for (int length = 0; length <= kInlineLength; ++length) {
+    shortText[length] = text[length];
+    if (text[length] != '\0') continue;
+    release();
+    memcpy(m_storage, shortText, sizeof(shortText));
+    m_length = length;
+    return *this;
+  }
+  assign(text, strlen(text));
   return *this;
 }
 
@@ -124,35 +185,27 @@ HString& HString::operator=(const HString& other) {
   return *this;
 }
 
-HString::operator const char*() const {
-  return GetStr();
-}
-
-const char* HString::GetStr() const {
-  return m_data == nullptr ? kEmptyText : m_data;
-}
-
-int HString::GetLength() const {
-  return m_length;
-}
-
-bool HString::IsEmpty() const {
-  return m_length == 0;
+HString& HString::operator=(HString&& other) noexcept {
+  if (this != &other) {
+    release();
+    memcpy(m_storage, other.m_storage, sizeof(m_storage));
+    m_length = other.m_length;
+    other.m_length = 0;
+    other.m_storage[0] = '\0';
+  }
+  return *this;
 }
 
 void HString::Empty() {
-  delete[] m_data;
-  m_data = nullptr;
-  m_length = 0;
-  m_capacity = 0;
+  release();
 }
 
 char HString::operator[](int index) const {
-  return (index >= 0 && index < m_length) ? m_data[index] : '\0';
+  return (index >= 0 && index < m_length) ? GetStr()[index] : '\0';
 }
 
 char& HString::operator[](int index) {
-  if (index >= 0 && index < m_length) return m_data[index];
+  if (index >= 0 && index < m_length) return characters()[index];
   // One scratch byte for the whole host: commands run on the host's one thread.
   static char scratch;
   scratch = '\0';
@@ -161,19 +214,23 @@ char& HString::operator[](int index) {
 
 HString& HString::operator+=(char c) {
   if (c == '\0') return *this;
-  if (m_length == m_capacity) {
-    // Doubling keeps a run of appends linear in the final length.
-    if (m_length >= INT_MAX - 1) throw OutOfMemory();
-    const int capacity =
-        m_capacity < 8 ? 8 : (m_capacity > INT_MAX / 2 - 1 ? INT_MAX - 1 : m_capacity * 2);
-    char* grown = new char[static_cast<size_t>(capacity) + 1];
-    memcpy(grown, GetStr(), static_cast<size_t>(m_length));
-    delete[] m_data;
-    m_data = grown;
-    m_capacity = capacity;
+  if (m_length < kInlineLength || (!isInline() && m_length < heapCapacity())) {
+    char* text = characters();
+    text[m_length] = c;
+    text[++m_length] = '\0';
+    return *this;
   }
-  m_data[m_length++] = c;
-  m_data[m_length] = '\0';
+  // Doubling keeps a run of appends linear in the final length.
+  if (m_length >= INT_MAX - 1) throw OutOfMemory();
+  const int capacity = m_length > INT_MAX / 2 - 1 ? INT_MAX - 1 : m_length * 2;
+  char* grown = new char[static_cast<size_t>(capacity) + 1];
+  memcpy(grown, GetStr(), static_cast<size_t>(m_length));
+  grown[m_length] = c;
+  grown[m_length + 1] = '\0';
+  const int length = m_length + 1;
+  release();
+  setHeap(grown, capacity);
+  m_length = length;
   return *this;
 }
 
@@ -200,8 +257,9 @@ int HString::Find(const char* sub, int start) const {
 }
 
 int HString::ReverseFind(char c) const {
+  const char* text = GetStr();
   for (int i = m_length - 1; i >= 0; --i) {
-    if (m_data[i] == c) return i;
+    if (text[i] == c) return i;
   }
   return -1;
 }
@@ -224,7 +282,7 @@ HString HString::Mid(size_t first, size_t count) const {
   const size_t length = static_cast<size_t>(m_length);
   if (first >= length) return part;
   const size_t available = length - first;
-  part.assign(m_data + first, count < available ? count : available);
+  part.assign(GetStr() + first, count < available ? count : available);
   return part;
 }
 
@@ -245,9 +303,8 @@ int HString::Replace(const char* oldText, const char* newText) {
   }
   if (replaced == 0) return 0;
   const size_t resultLength = length - replaced * oldLength + replaced * newLength;
-  if (resultLength > static_cast<size_t>(INT_MAX) - 1) throw OutOfMemory();
-  char* result = new char[resultLength + 1];
-  char* out = result;
+  HString result;
+  char* out = result.prepare(resultLength);
   size_t from = 0;
   for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
        from = hit + oldLength) {
@@ -257,10 +314,7 @@ int HString::Replace(const char* oldText, const char* newText) {
     out += newLength;
   }
   memcpy(out, text + from, length - from + 1);
-  delete[] m_data;
-  m_data = result;
-  m_length = static_cast<int>(resultLength);
-  m_capacity = m_length;
+  *this = static_cast<HString&&>(result);
   return static_cast<int>(replaced);
 }
 

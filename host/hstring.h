@@ -1,28 +1,42 @@
 // The host's 8-bit string. It always holds a NUL-terminated text without
 // embedded NUL bytes; positions are 0-based ints, lengths never exceed INT_MAX.
 // Every operation stays inside the string whatever position or size it is
-// given.
+// given. Texts of up to 11 bytes are held inside the object, without any
+// allocation; longer ones on the heap. The layout is part of the host's
+// binary interface (modules hold strings by value), and the few accessors
+// that only read it are inline.
 #pragma once
 
 #include <stddef.h>
+#include <string.h>
 
 #include "core_export.h"
+#include "relocatable.h"
 
 class TAVIXCORE_API HString {
  public:
-  HString();
+  HString() : m_storage(), m_length(0) {}
   // A null text gives the empty string.
   HString(const char* text);  // NOLINT(google-explicit-constructor): host API
   HString(const HString& other);
-  ~HString();
+  // Takes other's text; other is left empty.
+  HString(HString&& other) noexcept : m_length(other.m_length) {
+    memcpy(m_storage, other.m_storage, sizeof(m_storage));
+    other.m_length = 0;
+    other.m_storage[0] = '\0';
+  }
+  ~HString() {
+    if (!isInline()) release();
+  }
 
   HString& operator=(const char* text);
   HString& operator=(const HString& other);
+  HString& operator=(HString&& other) noexcept;
 
-  operator const char*() const;  // NOLINT(google-explicit-constructor): host API
-  const char* GetStr() const;
-  int GetLength() const;
-  bool IsEmpty() const;
+  operator const char*() const { return GetStr(); }  // NOLINT(google-explicit-constructor)
+  const char* GetStr() const { return isInline() ? m_storage : heapText(); }
+  int GetLength() const { return m_length; }
+  bool IsEmpty() const { return m_length == 0; }
   void Empty();
 
   // Positions outside 0..length-1 read as NUL. The writable form returns a
@@ -66,9 +80,33 @@ class TAVIXCORE_API HString {
   void Format(const char* format, ...);
 
  private:
-  void assign(const char* text, size_t length);
+  static constexpr int kInlineLength = 11;
 
-  char* m_data;
+  bool isInline() const { return m_length <= kInlineLength; }
+  static_assert(sizeof(char*) + sizeof(int) <= kInlineLength + 1, "a heap text's fields fit");
+  char* characters();
+  char* heapText() const {
+    char* text;
+    memcpy(&text, m_storage, sizeof(text));
+    return text;
+  }
+  int heapCapacity() const;
+  void setHeap(char* text, int capacity);
+  void assign(const char* text, size_t length);
+  // Room for length characters and the NUL, inline or on the heap; the old
+  // text is gone. Returns where the characters go.
+  char* prepare(size_t length);
+  void release();
+
+  // Bytes 0-11: the text and its NUL while the length is at most 11;
+  // otherwise the heap text's address (0-7) and capacity (8-11), the
+  // characters it can hold without its NUL.
+  alignas(8) char m_storage[12];
   int m_length;
-  int m_capacity;  // bytes usable for characters in m_data, NUL not counted
+};
+
+// A string holds no pointer into itself, so its bytes may move.
+template <>
+struct IsRelocatable<HString> {
+  static constexpr bool value = true;
 };
