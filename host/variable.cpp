@@ -1,16 +1,43 @@
 #include "variable.h"
 
-#include <string.h>
+#include <new>
+
+// The strings of an array value, in one block after this header, shared by
+// every copy of the value; an element write by one holder first gives it a
+// block of its own.
+struct Variable::Array {
+  int holders;
+  int count;
+
+  HString* elements() {
+    static_assert(alignof(HString) <= sizeof(Array), "the strings follow the header aligned");
+    return reinterpret_cast<HString*>(this + 1);
+  }
+
+  // count empty strings, or copies of from's when given.
+  static Array* create(int count, Array* from) {
+    void* block = ::operator new(sizeof(Array) + sizeof(HString) * static_cast<size_t>(count));
+    Array* array = new (block) Array{1, 0};
+    try {
+      for (; array->count < count; ++array->count) {
+        new (array->elements() + array->count)
+            HString(from ? from->elements()[array->count] : HString());
+      }
+    } catch (...) {
+      array->release();
+      throw;
+    }
+    return array;
+  }
+
+  void release() {
+    if (--holders > 0) return;
+    for (int i = 0; i < count; ++i) elements()[i].~HString();
+    ::operator delete(this);
+  }
+};
 
 namespace {
-
-char* copyText(const char* text) {
-  const char* source = text == nullptr ? "" : text;
-  const size_t length = strlen(source);
-  char* copy = new char[length + 1];
-  memcpy(copy, source, length + 1);
-  return copy;
-}
 
 Variable::VarType knownType(Variable::VarType type) {
   switch (type) {
@@ -25,24 +52,22 @@ Variable::VarType knownType(Variable::VarType type) {
 
 }  // namespace
 
-Variable::Variable(VarType type, int count)
-    : m_type(knownType(type)), m_int(0), m_text(nullptr), m_elements(nullptr), m_count(0) {
-  if (m_type == TypeString) m_text = copyText("");
-  if (m_type == TypeStringArray && count > 0) {
-    try {
-      m_elements = new char*[static_cast<size_t>(count)]();
-      m_count = count;
-      for (int i = 0; i < count; ++i) m_elements[i] = copyText("");
-    } catch (...) {
-      clear();
-      throw;
-    }
-  }
+Variable::Variable(VarType type, int count) : m_type(knownType(type)), m_int(0), m_array(nullptr) {
+  if (m_type == TypeStringArray && count > 0) m_array = Array::create(count, nullptr);
 }
 
 Variable::Variable(const Variable& other)
-    : m_type(TypeNone), m_int(0), m_text(nullptr), m_elements(nullptr), m_count(0) {
-  copyFrom(other);
+    : m_type(other.m_type), m_int(other.m_int), m_text(other.m_text), m_array(other.m_array) {
+  if (m_array != nullptr) ++m_array->holders;
+}
+
+Variable::Variable(Variable&& other) noexcept
+    : m_type(other.m_type),
+      m_int(other.m_int),
+      m_text(static_cast<HString&&>(other.m_text)),
+      m_array(other.m_array) {
+  other.m_type = TypeNone;
+  other.m_array = nullptr;
 }
 
 Variable::~Variable() {
@@ -54,8 +79,8 @@ Variable::VarType Variable::getType() const {
 }
 
 const char* Variable::getStringValue(int index) const {
-  if (index == -1 && m_type == TypeString) return m_text;
-  if (m_type == TypeStringArray && index >= 0 && index < m_count) return m_elements[index];
+  if (index == -1 && m_type == TypeString) return m_text.GetStr();
+  if (index >= 0 && index < getCount()) return m_array->elements()[index].GetStr();
   return "";
 }
 
@@ -64,7 +89,7 @@ int Variable::getIntValue(int index) const {
 }
 
 int Variable::getCount() const {
-  return m_type == TypeStringArray ? m_count : 0;
+  return m_array == nullptr ? 0 : m_array->count;
 }
 
 void Variable::setValue(int value, int index) {
@@ -76,59 +101,44 @@ void Variable::setValue(int value, int index) {
 
 void Variable::setValue(const char* value, int index) {
   if (index == -1) {
-    char* text = copyText(value);
-    clear();
+    m_text = value;  // first: a failed copy leaves the value as it was
+    if (m_array != nullptr) m_array->release();
+    m_array = nullptr;
+    m_int = 0;
     m_type = TypeString;
-    m_text = text;
     return;
   }
-  if (m_type != TypeStringArray || index < 0 || index >= m_count) return;
-  char* text = copyText(value);
-  delete[] m_elements[index];
-  m_elements[index] = text;
+  if (index < 0 || index >= getCount()) return;
+  if (m_array->holders > 1) {
+    Array* own = Array::create(m_array->count, m_array);
+    m_array->release();
+    m_array = own;
+  }
+  m_array->elements()[index] = value;
 }
 
 Variable& Variable::operator=(const Variable& other) {
+  if (this != &other) *this = Variable(other);
+  return *this;
+}
+
+Variable& Variable::operator=(Variable&& other) noexcept {
   if (this != &other) {
-    Variable copy(other);
     clear();
-    // Take over the copy's storage so that a failed allocation leaves *this intact.
-    m_type = copy.m_type;
-    m_int = copy.m_int;
-    m_text = copy.m_text;
-    m_elements = copy.m_elements;
-    m_count = copy.m_count;
-    copy.m_type = TypeNone;
-    copy.m_text = nullptr;
-    copy.m_elements = nullptr;
-    copy.m_count = 0;
+    m_type = other.m_type;
+    m_int = other.m_int;
+    m_text = static_cast<HString&&>(other.m_text);
+    m_array = other.m_array;
+    other.m_type = TypeNone;
+    other.m_array = nullptr;
   }
   return *this;
 }
 
 void Variable::clear() {
-  delete[] m_text;
-  m_text = nullptr;
-  for (int i = 0; i < m_count; ++i) delete[] m_elements[i];
-  delete[] m_elements;
-  m_elements = nullptr;
-  m_count = 0;
+  if (m_array != nullptr) m_array->release();
+  m_array = nullptr;
+  m_text.Empty();
   m_int = 0;
   m_type = TypeNone;
-}
-
-void Variable::copyFrom(const Variable& other) {
-  try {
-    m_type = other.m_type;
-    m_int = other.m_int;
-    if (other.m_text != nullptr) m_text = copyText(other.m_text);
-    if (other.m_count > 0) {
-      m_elements = new char*[static_cast<size_t>(other.m_count)]();
-      m_count = other.m_count;
-      for (int i = 0; i < m_count; ++i) m_elements[i] = copyText(other.m_elements[i]);
-    }
-  } catch (...) {
-    clear();  // elements not yet copied are null
-    throw;
-  }
 }

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "core_export.h"
+#include "hstring.h"
 
 class TAVIXCORE_API Variable {
  public:
@@ -11,7 +12,10 @@ class TAVIXCORE_API Variable {
   // An array (TypeStringArray) starts with count empty strings; other types
   // ignore count. Any other type code gives TypeNone.
   Variable(VarType type = TypeNone, int count = 0);  // NOLINT(google-explicit-constructor)
+  // Copies share an array's strings until either side writes an element.
   Variable(const Variable& other);
+  // Takes other's value; other is left TypeNone.
+  Variable(Variable&& other) noexcept;
   virtual ~Variable();
   virtual VarType getType() const;
 
@@ -30,15 +34,16 @@ class TAVIXCORE_API Variable {
   void setValue(int value, int index);
   void setValue(const char* value, int index);
 
+  // As the copy constructor; a failed copy leaves this value as it was.
   Variable& operator=(const Variable& other);
+  Variable& operator=(Variable&& other) noexcept;
 
  private:
+  struct Array;
   void clear();
-  void copyFrom(const Variable& other);
 
   VarType m_type;
   int m_int;
-  char* m_text;
-  char** m_elements;
-  int m_count;
+  HString m_text;
+  Array* m_array;  // shared by copies; counts its holders
 };
