@@ -1,8 +1,14 @@
 // The host's growable array: a count and contiguous elements. Arguments reach
 // a command as TArray<Variable>, given options as TArray<CommandOption>.
+// Elements must move without throwing.
 #pragma once
 
+#include <stdlib.h>
+
+#include <new>
+
 #include "core_export.h"
+#include "relocatable.h"
 
 // Raises the standard allocation exception when an array cannot grow further.
 [[noreturn]] TAVIXCORE_API void tarrayCapacityExhausted();
@@ -15,8 +21,10 @@ class TArray {
   TArray(const TArray&) = delete;
   TArray& operator=(const TArray&) = delete;
 
-  // Destroys every slot of the buffer (elements and spare slots alike).
-  virtual ~TArray() { delete[] m_buffer; }
+  virtual ~TArray() {
+    destroy(0, m_count);
+    free(m_buffer);
+  }
 
   // Removes up to n elements from index on and closes the gap. Arguments
   // outside the array are clamped to what exists: an index outside
@@ -25,19 +33,26 @@ class TArray {
   virtual void removeAt(int index, int n) {
     if (index < 0 || index >= m_count || n <= 0) return;
     const int removed = n < m_count - index ? n : m_count - index;
-    for (int i = index; i < m_count - removed; ++i) m_buffer[i] = m_buffer[i + removed];
+    for (int i = index; i < m_count - removed; ++i)
+      m_buffer[i] = static_cast<T&&>(m_buffer[i + removed]);
+    destroy(m_count - removed, m_count);
     m_count -= removed;
   }
 
-  // Forgets every element; the buffer and its strings stay for reuse.
-  virtual void removeAll() { m_count = 0; }
+  // Removes every element; the buffer stays for reuse.
+  virtual void removeAll() {
+    destroy(0, m_count);
+    m_count = 0;
+  }
 
-  // Appends a copy of value. Growth adds the grow step to an empty array and
-  // at least doubles after that, so n appends copy O(n) elements in all. When
-  // growing fails, the array keeps its elements and buffer.
+  // Appends value, moved into place. Growth adds the grow step to an empty
+  // array and at least doubles after that, so n appends move O(n) elements
+  // in all; elements of a relocatable type do not move at all where the heap
+  // can grow the buffer in place. When growing fails, the array keeps its
+  // elements and buffer.
   void add(T value) {
     if (m_count >= m_capacity) grow();
-    m_buffer[m_count] = value;
+    new (m_buffer + m_count) T(static_cast<T&&>(value));
     ++m_count;
   }
 
@@ -50,6 +65,10 @@ class TArray {
   T& operator[](int index) { return m_buffer[index]; }
 
  private:
+  void destroy(int from, int to) {
+    for (int i = from; i < to; ++i) m_buffer[i].~T();
+  }
+
   void grow() {
     const long long step = m_growStep > 0 ? m_growStep : 1;
     long long capacity = m_capacity + step;
@@ -57,15 +76,22 @@ class TArray {
     const long long limit = 0x7fffffff;
     if (capacity > limit) capacity = limit;
     if (capacity <= m_count) tarrayCapacityExhausted();
-    T* buffer = new T[static_cast<unsigned long long>(capacity)];
-    try {
-      for (int i = 0; i < m_count; ++i) buffer[i] = m_buffer[i];
-    } catch (...) {
-      delete[] buffer;
-      throw;
+    // Only the slots in use hold elements; the rest of the buffer is raw.
+    const size_t bytes = sizeof(T) * static_cast<size_t>(capacity);
+    void* buffer = nullptr;
+    if constexpr (IsRelocatable<T>::value) {
+      buffer = realloc(static_cast<void*>(m_buffer), bytes);
+      if (buffer == nullptr) throw std::bad_alloc();
+    } else {
+      buffer = malloc(bytes);
+      if (buffer == nullptr) throw std::bad_alloc();
+      for (int i = 0; i < m_count; ++i) {
+        new (static_cast<T*>(buffer) + i) T(static_cast<T&&>(m_buffer[i]));
+        m_buffer[i].~T();
+      }
+      free(m_buffer);
     }
-    delete[] m_buffer;
-    m_buffer = buffer;
+    m_buffer = static_cast<T*>(buffer);
     m_capacity = static_cast<int>(capacity);
   }
 
