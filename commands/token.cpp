@@ -35,15 +35,15 @@ bool StrTokCmd::execute(const TArray<CommandOption>& options, const TArray<Varia
     result.setValue("", -1);
     return true;
   }
-  const HString token = nextToken(tokenOptions.delims, tokenOptions.matchAll);
+  const HString token = nextToken(tokenOptions);
   result.setValue(token, -1);
   return true;
 }
 
-HString StrTokCmd::nextToken(const HString& delims, bool matchAll) {
+HString StrTokCmd::nextToken(const TokenOptions& options) {
   const TokenSpan span =
-      matchAll ? scanMatchAllToken(m_remainder, m_remainderStart, delims)
-               : scanCharSetToken(m_remainder, m_remainderStart, DelimiterSet(delims));
+      options.matchAll ? scanMatchAllToken(m_remainder, m_remainderStart, options)
+                       : scanCharSetToken(m_remainder, m_remainderStart, DelimiterSet(options));
   HString token = m_remainder.Mid(static_cast<size_t>(m_remainderStart),
                                   static_cast<size_t>(span.end - m_remainderStart));
   m_remainderStart = span.next;

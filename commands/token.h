@@ -6,6 +6,7 @@
 
 #include "../host/command.h"
 #include "../host/hstring.h"
+#include "token_scan.h"
 
 class StrTokCmd : public Command {
  public:
@@ -24,7 +25,7 @@ class StrTokCmd : public Command {
 
  private:
   // Takes the next token off a non-empty remainder and shortens it.
-  HString nextToken(const HString& delims, bool matchAll);
+  HString nextToken(const TokenOptions& options);
   bool remainderIsEmpty() const;
 
   // The remainder is m_remainder from m_remainderStart on; keeping the start

@@ -8,8 +8,8 @@ namespace {
 
 // Character-set mode: runs of delimiters anywhere separate once, so no
 // element is empty and none holds a delimiter character.
-void splitByCharSet(const HString& text, const HString& delims, HStringArray& tokens) {
-  const DelimiterSet set(delims);
+void splitByCharSet(const HString& text, const TokenOptions& options, HStringArray& tokens) {
+  const DelimiterSet set(options);
   for (int start = 0; start < text.GetLength();) {
     const TokenSpan span = scanCharSetToken(text, start, set);
     if (span.end > start) tokens.add(text.Mid(start, span.end - start));
@@ -19,9 +19,10 @@ void splitByCharSet(const HString& text, const HString& delims, HStringArray& to
 
 // Match-all mode: every occurrence ends one element, empty ones included;
 // nothing follows an occurrence that ends the text.
-void splitByDelimiterString(const HString& text, const HString& delims, HStringArray& tokens) {
+void splitByDelimiterString(const HString& text, const TokenOptions& options,
+                            HStringArray& tokens) {
   int start = 0;
-  for (TokenSpan span; (span = scanMatchAllToken(text, start, delims)).delimited;
+  for (TokenSpan span; (span = scanMatchAllToken(text, start, options)).end < text.GetLength();
        start = span.next) {
     tokens.add(text.Mid(start, span.end - start));
   }
@@ -54,9 +55,9 @@ bool StrTokArrayCmd::execute(const TArray<CommandOption>& options, const TArray<
 
   HStringArray tokens;
   if (tokenOptions.matchAll) {
-    splitByDelimiterString(text, tokenOptions.delims, tokens);
+    splitByDelimiterString(text, tokenOptions, tokens);
   } else {
-    splitByCharSet(text, tokenOptions.delims, tokens);
+    splitByCharSet(text, tokenOptions, tokens);
   }
   if (tokens.count() == 0) {
     Command::logWarning("Couldn't find any string tokens");

@@ -1,5 +1,7 @@
 #include "token_scan.h"
 
+#include <string.h>
+
 #include "../host/command.h"
 #include "command_frame.h"
 
@@ -12,13 +14,13 @@ constexpr int kTokenOptionCount = 2;
 }  // namespace
 
 bool readTokenOptions(const TArray<CommandOption>& options, TokenOptions& tokenOptions) {
-  tokenOptions.delims = kDefaultDelimiters;
-  tokenOptions.matchAll = false;
+  tokenOptions = TokenOptions();
   for (int i = 0; i < options.count(); ++i) {
     const int declared = declaredOptionIndex(options[i], kTokenOptionCount);
     if (declared == kDelimsOption) {
       tokenOptions.delims = options[i].getValue().getStringValue(-1);
-      if (tokenOptions.delims.IsEmpty()) {
+      tokenOptions.delimsLength = static_cast<int>(strlen(tokenOptions.delims));
+      if (tokenOptions.delimsLength == 0) {
         Command::logError("Empty string argument for -delims option");
         return false;
       }
@@ -29,24 +31,35 @@ bool readTokenOptions(const TArray<CommandOption>& options, TokenOptions& tokenO
   return true;
 }
 
-DelimiterSet::DelimiterSet(const HString& delims) : m_members() {
-  const char* text = delims.GetStr();
-  for (int i = 0; i < delims.GetLength(); ++i)
-    m_members[static_cast<unsigned char>(text[i])] = true;
+DelimiterSet::DelimiterSet(const TokenOptions& options) : m_single(options.delims[0]) {
+  for (int i = 1; i < options.delimsLength && m_single != '\0'; ++i) {
+    if (options.delims[i] != m_single) m_single = '\0';
+  }
+  if (m_single != '\0') return;
+  for (uint64_t& word : m_members) word = 0;
+  for (int i = 0; i < options.delimsLength; ++i) {
+    const auto byte = static_cast<unsigned char>(options.delims[i]);
+    m_members[byte >> 6] |= uint64_t{1} << (byte & 63);
+  }
 }
 
 TokenSpan scanCharSetToken(const HString& text, int start, const DelimiterSet& set) {
   const char* chars = text.GetStr();
   const int length = text.GetLength();
   int position = start;
+  if (set.single() != '\0') {  // one delimiter character: found at memory speed
+    const void* found = memchr(chars + start, set.single(), static_cast<size_t>(length - start));
+    position =
+        found == nullptr ? length : static_cast<int>(static_cast<const char*>(found) - chars);
+  }
   while (position < length && !set.contains(chars[position])) ++position;
   const int end = position;
   while (position < length && set.contains(chars[position])) ++position;
-  return TokenSpan{end, position, end < length};
+  return TokenSpan{end, position};
 }
 
-TokenSpan scanMatchAllToken(const HString& text, int start, const HString& delims) {
-  const int found = text.Find(delims, start);
-  if (found < 0) return TokenSpan{text.GetLength(), text.GetLength(), false};
-  return TokenSpan{found, found + delims.GetLength(), true};
+TokenSpan scanMatchAllToken(const HString& text, int start, const TokenOptions& options) {
+  const int found = text.Find(options.delims, start);
+  if (found < 0) return TokenSpan{text.GetLength(), text.GetLength()};
+  return TokenSpan{found, found + options.delimsLength};
 }

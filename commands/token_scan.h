@@ -3,6 +3,8 @@
 // proportion to the text.
 #pragma once
 
+#include <stdint.h>
+
 #include "../host/command_option.h"
 #include "../host/hstring.h"
 #include "../host/tarray.h"
@@ -10,9 +12,12 @@
 // Space, tab, line feed and carriage return.
 constexpr const char* kDefaultDelimiters = " \t\n\r";
 
-// The options of one run: the delimiter set (or string) and the mode.
+// The options of one run: the delimiter set (or string) and the mode. The
+// delimiters are read where they stand, in the option's value or the
+// default, which stay put for the whole run.
 struct TokenOptions {
-  HString delims;
+  const char* delims = kDefaultDelimiters;
+  int delimsLength = 4;
   bool matchAll = false;
 };
 
@@ -26,20 +31,26 @@ bool readTokenOptions(const TArray<CommandOption>& options, TokenOptions& tokenO
 // Membership of the 8-bit characters of a delimiter set, byte for byte.
 class DelimiterSet {
  public:
-  explicit DelimiterSet(const HString& delims);
-  bool contains(char c) const { return m_members[static_cast<unsigned char>(c)]; }
+  explicit DelimiterSet(const TokenOptions& options);
+  bool contains(char c) const {
+    if (m_single != '\0') return c == m_single;
+    const auto byte = static_cast<unsigned char>(c);
+    return (m_members[byte >> 6] >> (byte & 63)) & 1;
+  }
+  // The set's one character, when it has exactly one; NUL otherwise.
+  char single() const { return m_single; }
 
  private:
-  bool m_members[256];
+  uint64_t m_members[4];  // one bit per byte value, for sets of more than one character
+  char m_single;
 };
 
 // One token of text, starting at start: it ends before end, and the text
-// after it (and after the delimiters dropped with it) begins at next.
-// delimited tells whether a delimiter followed the token.
+// after it (and after the delimiters dropped with it) begins at next. A
+// delimiter followed the token exactly when end is before the text's end.
 struct TokenSpan {
   int end;
   int next;
-  bool delimited;
 };
 
 // Character-set mode: the token runs up to the first character of the set;
@@ -47,8 +58,8 @@ struct TokenSpan {
 // text begins with a set character at start.
 TokenSpan scanCharSetToken(const HString& text, int start, const DelimiterSet& set);
 
-// Match-all mode: the token runs up to the next whole occurrence of delims,
-// which is dropped; occurrences are neither merged nor overlapped. Joining the
-// tokens of a text with delims gives back the text, less its final delimiter
-// string when it ends with one.
-TokenSpan scanMatchAllToken(const HString& text, int start, const HString& delims);
+// Match-all mode: the token runs up to the next whole occurrence of the
+// delimiter string, which is dropped; occurrences are neither merged nor
+// overlapped. Joining the tokens of a text with the delimiter string gives
+// back the text, less its final delimiter string when it ends with one.
+TokenSpan scanMatchAllToken(const HString& text, int start, const TokenOptions& options);
