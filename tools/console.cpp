@@ -92,7 +92,9 @@ bool buildCall(const Command& command, const TArray<ScriptWord>& words, TArray<V
   return true;
 }
 
-void runWords(PluginSession& session, const TArray<ScriptWord>& words, Outcome& outcome) {
+// Runs the command the words name. The words are let go once the call is
+// built, so that a long line is not held twice while the command runs.
+void runWords(PluginSession& session, TArray<ScriptWord>& words, Outcome& outcome) {
   outcome.command = words[0].text;
   Command* command = session.find(words[0].text);
   if (command == nullptr) {
@@ -102,6 +104,7 @@ void runWords(PluginSession& session, const TArray<ScriptWord>& words, Outcome& 
   TArray<Variable> args;
   TArray<CommandOption> options;
   if (!buildCall(*command, words, args, options, outcome.error)) return;
+  words.removeAll();
   LogCapture capture(outcome.log);
   if (!command->checkArgSyntax(args, options)) {
     HString syntax;

@@ -3,7 +3,7 @@
 #include <errno.h>
 #include <string.h>
 
-void OutputStream::write(const char* bytes, size_t count) {
+void OutputStream::writeSlowly(const char* bytes, size_t count) {
   if (m_file == nullptr) {
     m_memory.append(bytes, count);
     return;
@@ -22,11 +22,6 @@ void OutputStream::write(const char* bytes, size_t count) {
 
 OutputStream& OutputStream::operator<<(const char* text) {
   write(text, strlen(text));
-  return *this;
-}
-
-OutputStream& OutputStream::operator<<(char c) {
-  write(&c, 1);
   return *this;
 }
 

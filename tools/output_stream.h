@@ -18,9 +18,19 @@ class OutputStream {
   OutputStream(const OutputStream&) = delete;
   OutputStream& operator=(const OutputStream&) = delete;
 
-  void write(const char* bytes, size_t count);
+  void write(const char* bytes, size_t count) {
+    if (m_file != nullptr && count <= sizeof(m_buffer) - m_used) {
+      for (size_t i = 0; i < count; ++i) m_buffer[m_used + i] = bytes[i];
+      m_used += count;
+    } else {
+      writeSlowly(bytes, count);
+    }
+  }
   OutputStream& operator<<(const char* text);
-  OutputStream& operator<<(char c);
+  OutputStream& operator<<(char c) {
+    write(&c, 1);
+    return *this;
+  }
   OutputStream& operator<<(long long number);
   OutputStream& operator<<(int number) { return *this << static_cast<long long>(number); }
 
@@ -35,6 +45,8 @@ class OutputStream {
   void clear() { m_memory.clear(); }
 
  private:
+  void writeSlowly(const char* bytes, size_t count);
+
   FILE* m_file;
   ByteBuffer m_memory;
   char m_buffer[16384];
