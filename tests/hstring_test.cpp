@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <initializer_list>
 #include <string>
 
 namespace {
@@ -24,6 +25,33 @@ TEST(HStringTest, IndexingAppendingAndAssigningStayInBounds) {
   EXPECT_EQ(std::string(text.GetStr()), "ab" + std::string(1000, 'c'));
   text = text.GetStr() + 1000;  // assigning from its own text
   EXPECT_STREQ(text.GetStr(), "cc");
+}
+
+// Texts of up to 11 bytes live inside the string, longer ones on the heap;
+// every way in or out of either keeps the text.
+TEST(HStringTest, TextsKeepTheirBytesAcrossTheInlineLimit) {
+  for (const size_t length : {0, 1, 10, 11, 12, 13, 23, 24, 100}) {
+    SCOPED_TRACE(length);
+    const std::string text(length, 'x');
+    HString built;
+    for (size_t i = 0; i < length; ++i) built += 'x';
+    HString copy(built);
+    HString moved(static_cast<HString&&>(copy));
+    EXPECT_EQ(copy.GetLength(), 0);
+    EXPECT_STREQ(copy.GetStr(), "");
+    for (const char* other : {"", "short", "a text longer than eleven bytes"}) {
+      HString target(other);
+      target = moved;
+      EXPECT_EQ(target.GetStr(), text);
+      EXPECT_EQ(target.GetLength(), static_cast<int>(length));
+      target = static_cast<HString&&>(HString(other));
+      EXPECT_STREQ(target.GetStr(), other);
+    }
+    moved = moved.GetStr() + length / 2;  // from its own text
+    EXPECT_EQ(moved.GetStr(), text.substr(length / 2));
+    EXPECT_EQ(moved.Mid(1).GetLength(),
+              static_cast<int>(moved.GetLength() > 0 ? moved.GetLength() - 1 : 0));
+  }
 }
 
 TEST(HStringTest, NullOperandsCountAsEmpty) {

@@ -2,9 +2,13 @@
 
 #include <gtest/gtest.h>
 
+#include <string>
+
+#include "../host/tarray.h"
+
 namespace {
 
-TEST(VariableTest, ArrayElementsStayInRangeAndCopiesAreDeep) {
+TEST(VariableTest, ArrayElementsStayInRangeAndCopiesShareUntilWritten) {
   Variable array(Variable::TypeStringArray, 2);
   array.setValue("a", 0);
   array.setValue("b", 1);
@@ -21,13 +25,20 @@ TEST(VariableTest, ArrayElementsStayInRangeAndCopiesAreDeep) {
   Variable copy;
   copy = array;
   array.setValue("changed", 0);
+  copy.setValue(copy.getStringValue(1), 1);  // from the shared text itself
   EXPECT_EQ(copy.getType(), Variable::TypeStringArray);
   EXPECT_STREQ(copy.getStringValue(0), "a");
+  EXPECT_STREQ(array.getStringValue(0), "changed");
   copy = copy;
   EXPECT_STREQ(copy.getStringValue(1), "b");
-  copy.setValue(5, -1);
+  Variable moved(static_cast<Variable&&>(copy));
+  EXPECT_EQ(copy.getType(), Variable::TypeNone);
   EXPECT_EQ(copy.getCount(), 0);
-  EXPECT_EQ(copy.getIntValue(-1), 5);
+  moved.setValue(moved.getStringValue(0), -1);
+  EXPECT_EQ(moved.getCount(), 0);
+  EXPECT_STREQ(moved.getStringValue(-1), "a");
+  moved.setValue(5, -1);
+  EXPECT_EQ(moved.getIntValue(-1), 5);
 }
 
 TEST(VariableTest, UnknownTypeCodesAreNone) {
@@ -35,6 +46,20 @@ TEST(VariableTest, UnknownTypeCodesAreNone) {
   EXPECT_EQ(v.getType(), Variable::TypeNone);
   EXPECT_EQ(v.getCount(), 0);
   EXPECT_STREQ(v.getStringValue(-1), "");
+}
+
+// Values move by their constructors when an array of them grows.
+TEST(VariableTest, ArraysOfValuesKeepThemAsTheyGrow) {
+  TArray<Variable> values;
+  for (int i = 0; i < 40; ++i) {
+    Variable value;
+    value.setValue(("value " + std::to_string(i) + " of forty").c_str(), -1);
+    values.add(value);
+  }
+  values.removeAt(0, 1);
+  ASSERT_EQ(values.count(), 39);
+  for (int i = 0; i < 39; ++i)
+    EXPECT_EQ(values[i].getStringValue(-1), "value " + std::to_string(i + 1) + " of forty");
 }
 
 }  // namespace
