@@ -44,7 +44,9 @@ class Searcher {
       for (const char* at = text + from; at <= last; ++at) {
         at = static_cast<const char*>(memchr(at, m_needle[0], static_cast<size_t>(last - at) + 1));
         if (at == nullptr) return npos;
-        if (memcmp(at, m_needle, m_length) == 0) return static_cast<size_t>(at - text);
+        size_t matched = 1;  // the first byte, found by memchr; the rest compared here
+        while (matched < m_length && at[matched] == m_needle[matched]) ++matched;
+        if (matched == m_length) return static_cast<size_t>(at - text);
       }
       return npos;
     }
@@ -164,19 +166,7 @@ void HString::assign(const char* text, size_t length) {
 }
 
 HString& HString::operator=(const char* text) {
-  if (text == nullptr) text = kEmptyText;
-  // A short text is measured while it is copied, in one pass; it goes to a
-  // buffer first, as it may lie inside this string.
-  char shortText[kInlineLength + 1];
-  for (int length = 0; length <= kInlineLength; ++length) {
-    shortText[length] = text[length];
-    if (text[length] != '\0') continue;
-    release();
-    memcpy(m_storage, shortText, sizeof(shortText));
-    m_length = length;
-    return *this;
-  }
-  assign(text, strlen(text));
+  assign(text, textLength(text));
   return *this;
 }
 
