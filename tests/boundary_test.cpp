@@ -4,7 +4,6 @@
 // through a command. Plain C++ without a test framework, so that it runs
 // wherever the module does.
 #include <stdio.h>
-#include <stdlib.h>
 #include <string.h>
 
 #include "../host/out_of_memory.h"
@@ -24,13 +23,10 @@ void expect(bool holds, const char* what) {
 }
 
 // n copies of c.
-Variable repeated(char c, size_t n) {
-  char* text = static_cast<char*>(malloc(n + 1));
-  memset(text, c, n);
-  text[n] = '\0';
-  Variable value = stringValue(text);
-  free(text);
-  return value;
+Variable repeated(char c, int n) {
+  HString text;
+  while (n-- > 0) text += c;
+  return stringValue(text);
 }
 
 }  // namespace

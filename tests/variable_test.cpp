@@ -41,11 +41,16 @@ TEST(VariableTest, ArrayElementsStayInRangeAndCopiesShareUntilWritten) {
   EXPECT_EQ(moved.getIntValue(-1), 5);
 }
 
-TEST(VariableTest, UnknownTypeCodesAreNone) {
-  const Variable v(static_cast<Variable::VarType>(7), 3);
-  EXPECT_EQ(v.getType(), Variable::TypeNone);
-  EXPECT_EQ(v.getCount(), 0);
-  EXPECT_STREQ(v.getStringValue(-1), "");
+TEST(VariableTest, NewValuesReadEmpty) {
+  const Variable unknown(static_cast<Variable::VarType>(7), 3);
+  EXPECT_EQ(unknown.getType(), Variable::TypeNone);
+  EXPECT_EQ(unknown.getCount(), 0);
+  EXPECT_STREQ(unknown.getStringValue(-1), "");
+  EXPECT_EQ(Variable(Variable::TypeInt).getIntValue(-1), 0);
+  Variable array(Variable::TypeStringArray, 3);
+  for (int i = 0; i < 3; ++i) EXPECT_STREQ(array.getStringValue(i), "");
+  array.setValue(5, -1);
+  EXPECT_EQ(array.getCount(), 0);
 }
 
 // Values move by their constructors when an array of them grows.
