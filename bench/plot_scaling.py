@@ -2,7 +2,7 @@
 """Draws the cost per token of the token commands against the number of
 tokens, from command_bench's JSON output, as a PNG (with Debian's gnuplot).
 
-    build/default/bin/command_bench --benchmark_filter=scaling \\
+    build/default/bin/command_bench --benchmark_filter=scaling --benchmark_repetitions=5 \\
         --benchmark_out=after.json --benchmark_out_format=json
     bench/plot_scaling.py scaling.png after.json [before.json]
 
@@ -16,11 +16,20 @@ import tempfile
 
 
 def series(path):
-    """{'strTokArray charSet': [(tokens, ns per token), ...], ...}"""
+    """{'strTokArray charSet': [(tokens, ns per token), ...], ...}, from the
+    medians of repeated runs where there are some, else from the runs."""
     lines = {}
-    for run in json.load(open(path))["benchmarks"]:
-        name = run["name"]  # BM_strTokArray_scaling/charSet/1000
-        if run.get("run_type") != "iteration" or "_scaling/" not in name:
+    runs = json.load(open(path))["benchmarks"]
+    medians = any(run.get("aggregate_name") == "median" for run in runs)
+    for run in runs:
+        name = run["name"]  # BM_strTokArray_scaling/charSet/1000, or ..._median
+        if medians:
+            if run.get("aggregate_name") != "median":
+                continue
+            name = name[: -len("_median")]
+        elif run.get("run_type") != "iteration":
+            continue
+        if "_scaling/" not in name or name.count("/") != 2:
             continue
         command, mode, tokens = name[3:].split("/")
         command = command.replace("_scaling", "").replace("_walk", " walk")
