@@ -53,14 +53,14 @@ def main():
             dash = "dashtype 2" if index > 0 else "dashtype 1"
             plots.append(f"'{data}' with linespoints lw 2 lc {color} {dash} title '{name} ({label})'")
     script = "\n".join([
-        "set terminal pngcairo size 900,560 font 'sans,10'",
+        "set terminal pngcairo size 900,640 font 'sans,10'",
         f"set output '{png}'",
         "set title 'Cost per token against the number of tokens'",
         "set logscale x",
         "set xlabel 'tokens in the text'",
         "set ylabel 'ns per token'",
         "set yrange [0:*]",
-        "set key outside right",
+        "set key outside below maxrows 4",
         "set grid",
         "plot " + ", ".join(plots),
     ])
