@@ -5,9 +5,8 @@
 
 #include <stdlib.h>
 
-#include <new>
-
 #include "core_export.h"
+#include "out_of_memory.h"
 #include "relocatable.h"
 
 // Raises the standard allocation exception when an array cannot grow further.
@@ -81,10 +80,10 @@ class TArray {
     void* buffer = nullptr;
     if constexpr (IsRelocatable<T>::value) {
       buffer = realloc(static_cast<void*>(m_buffer), bytes);
-      if (buffer == nullptr) throw std::bad_alloc();
+      if (buffer == nullptr) throw OutOfMemory();
     } else {
       buffer = malloc(bytes);
-      if (buffer == nullptr) throw std::bad_alloc();
+      if (buffer == nullptr) throw OutOfMemory();
       for (int i = 0; i < m_count; ++i) {
         new (static_cast<T*>(buffer) + i) T(static_cast<T&&>(m_buffer[i]));
         m_buffer[i].~T();

@@ -1,7 +1,6 @@
 #include "console.h"
 
 #include "../host/out_of_memory.h"
-
 #include "../host/plugin_exports.h"
 #include "byte_buffer.h"
 #include "log_capture.h"

@@ -5,7 +5,6 @@
 #include <string.h>
 
 #include "../host/out_of_memory.h"
-
 #include "../host/plugin_exports.h"
 
 namespace {
