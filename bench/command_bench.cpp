@@ -8,10 +8,10 @@
 #include <string_view>
 #include <vector>
 
-#include "../host/log_sink.h"
-#include "../tools/console.h"
-#include "../tools/plugin_session.h"
-#include "../tools/script_values.h"
+#include "log_sink.h"
+#include "console.h"
+#include "plugin_session.h"
+#include "script_values.h"
 
 namespace {
 

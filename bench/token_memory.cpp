@@ -8,9 +8,9 @@
 #include <cstdlib>
 #include <string>
 
-#include "../host/log_sink.h"
-#include "../tools/plugin_session.h"
-#include "../tools/script_values.h"
+#include "log_sink.h"
+#include "plugin_session.h"
+#include "script_values.h"
 
 namespace {
 

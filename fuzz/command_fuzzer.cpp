@@ -8,8 +8,8 @@
 #include <cstring>
 #include <string>
 
-#include "../tools/log_capture.h"
-#include "../tools/plugin_session.h"
+#include "log_capture.h"
+#include "plugin_session.h"
 #include "fuzz_support.h"
 
 namespace {

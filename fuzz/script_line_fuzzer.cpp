@@ -3,11 +3,11 @@
 #include <cstdint>
 #include <cstring>
 
-#include "../tools/console.h"
-#include "../tools/log_capture.h"
-#include "../tools/plugin_session.h"
-#include "../tools/script_line.h"
-#include "../tools/text_escape.h"
+#include "console.h"
+#include "log_capture.h"
+#include "plugin_session.h"
+#include "script_line.h"
+#include "text_escape.h"
 #include "fuzz_support.h"
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, size_t size) {

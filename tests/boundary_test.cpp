@@ -6,11 +6,11 @@
 #include <stdio.h>
 #include <string.h>
 
-#include "../host/out_of_memory.h"
-#include "../host/plugin_exports.h"
-#include "../tools/module_loader.h"
-#include "../tools/plugin_session.h"
-#include "../tools/script_values.h"
+#include "out_of_memory.h"
+#include "plugin_exports.h"
+#include "module_loader.h"
+#include "plugin_session.h"
+#include "script_values.h"
 #include "module_malloc_hook.h"
 
 namespace {

@@ -12,7 +12,7 @@
 #include <string>
 #include <vector>
 
-#include "../tools/module_loader.h"
+#include "module_loader.h"
 
 namespace {
 

@@ -1,5 +1,5 @@
 // The string array strTokArray collects its tokens in, the host's TArray.
-#include "../commands/hstring_array.h"
+#include "commands/hstring_array.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 // The host string's edges that no script reaches: null operands, positions
 // outside the string, NUL characters and formatting. Scripts drive the rest.
-#include "../host/hstring.h"
+#include "hstring.h"
 
 #include <gtest/gtest.h>
 

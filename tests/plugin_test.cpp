@@ -8,10 +8,10 @@
 #include <string>
 #include <vector>
 
-#include "../host/plugin_exports.h"
-#include "../tools/module_loader.h"
-#include "../tools/plugin_session.h"
-#include "../tools/script_values.h"
+#include "plugin_exports.h"
+#include "module_loader.h"
+#include "plugin_session.h"
+#include "script_values.h"
 
 namespace {
 

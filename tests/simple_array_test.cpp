@@ -1,4 +1,4 @@
-#include "../plugin/simple_array.h"
+#include "plugin/simple_array.h"
 
 #include <gtest/gtest.h>
 

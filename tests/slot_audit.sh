@@ -32,7 +32,7 @@ void layOutAll(HObject* a, Command* b, HomCorePluginBase* c, CommandPluginBase* 
 }'
 dump=$(printf '%s\n' "$probe" | "$compiler" -target x86_64-pc-windows-msvc -std=c++17 -fno-rtti \
   -fgnuc-version=12 -nostdinc -isystem "$here/../msabi/include" -isystem "$resource/include" \
-  -isystem "$mingw" -D_UCRT -I "$here/.." -x c++ -S -o /dev/null -Xclang -fdump-vtable-layouts -)
+  -isystem "$mingw" -D_UCRT -I "$here/../module" -I "$here/../tavixcore/include" -x c++ -S -o /dev/null -Xclang -fdump-vtable-layouts -)
 
 # One line per slot: class, slot, the qualified operation (and "pure").
 actual=$(printf '%s\n' "$dump" | awk '

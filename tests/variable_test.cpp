@@ -1,10 +1,10 @@
-#include "../host/variable.h"
+#include "variable.h"
 
 #include <gtest/gtest.h>
 
 #include <string>
 
-#include "../host/tarray.h"
+#include "tarray.h"
 
 namespace {
 

@@ -1,8 +1,8 @@
 // The growable array of strings in which strTokArray collects its tokens.
 #pragma once
 
-#include "../host/hstring.h"
-#include "../host/tarray.h"
+#include "hstring.h"
+#include "tarray.h"
 
 class HStringArray : public TArray<HString> {
  public:

@@ -4,8 +4,8 @@
 // the empty string. The remainder belongs to this one command object.
 #pragma once
 
-#include "../host/command.h"
-#include "../host/hstring.h"
+#include "command.h"
+#include "hstring.h"
 #include "token_scan.h"
 
 class StrTokCmd : public Command {

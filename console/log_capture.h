@@ -1,9 +1,9 @@
 // Catches every message the host logs while it lives, with its level.
 #pragma once
 
-#include "../host/hstring.h"
-#include "../host/log_sink.h"
-#include "../host/tarray.h"
+#include "hstring.h"
+#include "log_sink.h"
+#include "tarray.h"
 
 struct LogEntry {
   LogLevel level = LogInfo;

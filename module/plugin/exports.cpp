@@ -1,5 +1,5 @@
 // The functions the host finds by name when it loads the module.
-#include "../host/plugin_exports.h"
+#include "plugin_exports.h"
 #include "plugin_export.h"
 #include "string_commands_plugin.h"
 

@@ -4,7 +4,7 @@
 // released through their own deleteThis.
 #pragma once
 
-#include "../host/plugin_base.h"
+#include "plugin_base.h"
 #include "plugin_export.h"
 #include "simple_array.h"
 

@@ -4,8 +4,8 @@
 #include <stdlib.h>
 #include <string.h>
 
-#include "../host/out_of_memory.h"
-#include "../host/plugin_exports.h"
+#include "out_of_memory.h"
+#include "plugin_exports.h"
 
 namespace {
 

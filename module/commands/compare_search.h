@@ -1,14 +1,13 @@
-// strLeft, strRight, strMid and strReplace: new strings cut from, or
-// rewritten from, a script string. Script integers reach the host string
-// sign-extended to sizes (-1 becomes 2^64 - 1); the host string clamps them.
+// strCompare, strFind, strReverseFind and strLength: questions about strings
+// answered with an integer, stored exactly as the host string gives it.
 #pragma once
 
-#include "../host/command.h"
+#include "command.h"
 
-// strLeft "string" count: the first count characters.
-class StrLeftCmd : public Command {
+// strCompare "string1" "string2" [-noCase]: the sign orders string1 against string2.
+class StrCompareCmd : public Command {
  public:
-  StrLeftCmd();
+  StrCompareCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -20,13 +19,13 @@ class StrLeftCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrLeftCmd() override;
+  ~StrCompareCmd() override;
 };
 
-// strRight "string" count: the last count characters.
-class StrRightCmd : public Command {
+// strFind "string" "subString" index: first position at or after index, negative when absent.
+class StrFindCmd : public Command {
  public:
-  StrRightCmd();
+  StrFindCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -38,14 +37,14 @@ class StrRightCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrRightCmd() override;
+  ~StrFindCmd() override;
 };
 
-// strMid "string" firstIndex count: count characters from firstIndex; a count of
-// exactly -1 takes everything from firstIndex to the end.
-class StrMidCmd : public Command {
+// strReverseFind "string" "findChar": last position of findChar's first
+// character; an empty findChar is an error.
+class StrReverseFindCmd : public Command {
  public:
-  StrMidCmd();
+  StrReverseFindCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -57,13 +56,13 @@ class StrMidCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrMidCmd() override;
+  ~StrReverseFindCmd() override;
 };
 
-// strReplace "string" "subStringOld" "subStringNew": every occurrence replaced.
-class StrReplaceCmd : public Command {
+// strLength "string": the length in bytes.
+class StrLengthCmd : public Command {
  public:
-  StrReplaceCmd();
+  StrLengthCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -75,5 +74,5 @@ class StrReplaceCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrReplaceCmd() override;
+  ~StrLengthCmd() override;
 };

@@ -3,7 +3,7 @@
 #include <stdlib.h>
 #include <string.h>
 
-#include "../host/out_of_memory.h"
+#include "out_of_memory.h"
 
 ByteBuffer::~ByteBuffer() {
   free(m_data);

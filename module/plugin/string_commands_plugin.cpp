@@ -1,10 +1,10 @@
 #include "string_commands_plugin.h"
 
-#include "../commands/compare_search.h"
-#include "../commands/substring.h"
-#include "../commands/test_print.h"
-#include "../commands/token.h"
-#include "../commands/token_array.h"
+#include "commands/compare_search.h"
+#include "commands/substring.h"
+#include "commands/test_print.h"
+#include "commands/token.h"
+#include "commands/token_array.h"
 
 namespace {
 

@@ -2,8 +2,8 @@
 // the argument check and the walk over the options given.
 #pragma once
 
-#include "../host/command.h"
-#include "../host/hstring.h"
+#include "command.h"
+#include "hstring.h"
 
 constexpr const char* kStringCategory = "String";
 constexpr const char* kTestingCategory = "Testing";

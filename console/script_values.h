@@ -1,7 +1,7 @@
 // Script values built in one step, as a host builds arguments and option values.
 #pragma once
 
-#include "../host/variable.h"
+#include "variable.h"
 
 Variable stringValue(const char* text);
 Variable integerValue(int value);

@@ -3,7 +3,7 @@
 // any string tokens" and leaves the result as it was.
 #pragma once
 
-#include "../host/command.h"
+#include "command.h"
 
 class StrTokArrayCmd : public Command {
  public:

@@ -1,6 +1,6 @@
 #include "test_print.h"
 
-#include "../host/database.h"
+#include "database.h"
 #include "command_frame.h"
 
 TestPrintCmd::TestPrintCmd() : Command("testPrint", "Tests print command", "") {

@@ -2,7 +2,7 @@
 // LoadLibrary/GetProcAddress on Windows.
 #pragma once
 
-#include "../host/hstring.h"
+#include "hstring.h"
 
 class ModuleLibrary {
  public:

@@ -4,10 +4,10 @@
 // deleteThis, then unloads the library.
 #pragma once
 
-#include "../host/command.h"
-#include "../host/hstring.h"
-#include "../host/plugin_base.h"
-#include "../host/tarray.h"
+#include "command.h"
+#include "hstring.h"
+#include "plugin_base.h"
+#include "tarray.h"
 #include "module_loader.h"
 
 // The module file beside the running executable, or else in the lib folder

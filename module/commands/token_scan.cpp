@@ -2,7 +2,7 @@
 
 #include <string.h>
 
-#include "../host/command.h"
+#include "command.h"
 #include "command_frame.h"
 
 namespace {

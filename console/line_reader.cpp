@@ -3,7 +3,7 @@
 #include <errno.h>
 #include <string.h>
 
-#include "../host/out_of_memory.h"
+#include "out_of_memory.h"
 
 bool LineReader::refill() {
   errno = 0;

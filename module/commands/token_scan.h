@@ -5,9 +5,9 @@
 
 #include <stdint.h>
 
-#include "../host/command_option.h"
-#include "../host/hstring.h"
-#include "../host/tarray.h"
+#include "command_option.h"
+#include "hstring.h"
+#include "tarray.h"
 
 // Space, tab, line feed and carriage return.
 constexpr const char* kDefaultDelimiters = " \t\n\r";

@@ -9,8 +9,8 @@
 
 #include <stddef.h>
 
-#include "../host/hstring.h"
-#include "../host/tarray.h"
+#include "hstring.h"
+#include "tarray.h"
 
 struct ScriptWord {
   enum Kind { String, Integer, Option };

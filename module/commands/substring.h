@@ -1,13 +1,14 @@
-// strCompare, strFind, strReverseFind and strLength: questions about strings
-// answered with an integer, stored exactly as the host string gives it.
+// strLeft, strRight, strMid and strReplace: new strings cut from, or
+// rewritten from, a script string. Script integers reach the host string
+// sign-extended to sizes (-1 becomes 2^64 - 1); the host string clamps them.
 #pragma once
 
-#include "../host/command.h"
+#include "command.h"
 
-// strCompare "string1" "string2" [-noCase]: the sign orders string1 against string2.
-class StrCompareCmd : public Command {
+// strLeft "string" count: the first count characters.
+class StrLeftCmd : public Command {
  public:
-  StrCompareCmd();
+  StrLeftCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -19,13 +20,13 @@ class StrCompareCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrCompareCmd() override;
+  ~StrLeftCmd() override;
 };
 
-// strFind "string" "subString" index: first position at or after index, negative when absent.
-class StrFindCmd : public Command {
+// strRight "string" count: the last count characters.
+class StrRightCmd : public Command {
  public:
-  StrFindCmd();
+  StrRightCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -37,14 +38,14 @@ class StrFindCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrFindCmd() override;
+  ~StrRightCmd() override;
 };
 
-// strReverseFind "string" "findChar": last position of findChar's first
-// character; an empty findChar is an error.
-class StrReverseFindCmd : public Command {
+// strMid "string" firstIndex count: count characters from firstIndex; a count of
+// exactly -1 takes everything from firstIndex to the end.
+class StrMidCmd : public Command {
  public:
-  StrReverseFindCmd();
+  StrMidCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -56,13 +57,13 @@ class StrReverseFindCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrReverseFindCmd() override;
+  ~StrMidCmd() override;
 };
 
-// strLength "string": the length in bytes.
-class StrLengthCmd : public Command {
+// strReplace "string" "subStringOld" "subStringNew": every occurrence replaced.
+class StrReplaceCmd : public Command {
  public:
-  StrLengthCmd();
+  StrReplaceCmd();
   void deleteThis() override;
   const HRuntimeClass* getRuntimeClass() const override;
   bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
@@ -74,5 +75,5 @@ class StrLengthCmd : public Command {
   Variable::VarType getReturnType() const override;
 
  protected:
-  ~StrLengthCmd() override;
+  ~StrReplaceCmd() override;
 };

@@ -2,7 +2,7 @@
 // every run and never touches the result.
 #pragma once
 
-#include "../host/command.h"
+#include "command.h"
 
 class TestPrintCmd : public Command {
  public:

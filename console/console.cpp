@@ -1,7 +1,7 @@
 #include "console.h"
 
-#include "../host/out_of_memory.h"
-#include "../host/plugin_exports.h"
+#include "out_of_memory.h"
+#include "plugin_exports.h"
 #include "byte_buffer.h"
 #include "log_capture.h"
 #include "script_line.h"
