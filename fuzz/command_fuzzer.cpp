@@ -47,24 +47,34 @@ void addArgumentsOfItsShape(FuzzedDataProvider& data, const Command& command,
   }
 }
 
+// The declared-option index of the command's option of that name, or -1.
+int optionIndex(const Command& command, const char* name) {
+  int index = -1;
+  Variable::VarType type = Variable::TypeNone;
+  return command.getOptionSyntax(name, index, type) == 1 ? index : -1;
+}
+
 // The delimiters the token commands should use for these options, and the
 // mode; false when an empty delims value must make them fail.
-bool tokenOptions(const TArray<CommandOption>& options, std::string& delims, bool& matchAll) {
+bool tokenOptions(const Command& command, const TArray<CommandOption>& options,
+                  std::string& delims, bool& matchAll) {
+  const int delimsIndex = optionIndex(command, "delims");
+  const int matchAllIndex = optionIndex(command, "matchAll");
   delims = " \t\n\r";
   matchAll = false;
   for (int i = 0; i < options.count(); ++i) {
-    if (options[i].getIndex() == 0) delims = options[i].getValue().getStringValue(-1);
-    if (options[i].getIndex() == 0 && delims.empty()) return false;
-    matchAll = matchAll || options[i].getIndex() == 1;
+    if (options[i].getIndex() == delimsIndex) delims = options[i].getValue().getStringValue(-1);
+    if (options[i].getIndex() == delimsIndex && delims.empty()) return false;
+    matchAll = matchAll || options[i].getIndex() == matchAllIndex;
   }
   return true;
 }
 
-void checkTokens(const std::string& input, const TArray<CommandOption>& options,
-                 const Variable& result, bool array) {
+void checkTokens(const Command& command, const std::string& input,
+                 const TArray<CommandOption>& options, const Variable& result, bool array) {
   std::string delims;
   bool matchAll = false;
-  if (!tokenOptions(options, delims, matchAll)) return;
+  if (!tokenOptions(command, options, delims, matchAll)) return;
   if (!array) {
     require(matchAll ||
                 std::string(result.getStringValue(-1)).find_first_of(delims) == std::string::npos,
@@ -134,7 +144,7 @@ void runOneCall(FuzzedDataProvider& data) {
     require(result.getIntValue(-1) == static_cast<int>(std::strlen(args[0].getStringValue(-1))),
             "strLength is the byte length");
   } else if (name == "strTokArray" || name == "strTok") {
-    checkTokens(args.count() > 0 ? args[0].getStringValue(-1) : "", options, result,
+    checkTokens(command, args.count() > 0 ? args[0].getStringValue(-1) : "", options, result,
                 name == "strTokArray");
   }
 }

@@ -19,13 +19,12 @@ probe='
 #include "commands/token_array.h"
 #include "plugin/string_commands_plugin.h"
 template <class T> void layOut(T* object) { object->getRuntimeClass(); }
+template <class... Commands> void create() { Command* made[] = {new Commands()...}; (void)made; }
 void layOutAll(HObject* a, Command* b, HomCorePluginBase* c, CommandPluginBase* d,
-               TavixStringCommandsPlugin* e, StrCompareCmd* f, StrFindCmd* g, StrLeftCmd* h,
-               StrLengthCmd* i, StrMidCmd* j, StrReplaceCmd* k, StrRightCmd* l,
-               StrReverseFindCmd* m, StrTokCmd* n, StrTokArrayCmd* o, TestPrintCmd* p,
-               HStringArray* q, Variable* r) {
-  layOut(a), layOut(b), layOut(c), layOut(d), layOut(f), layOut(g), layOut(h), layOut(i);
-  layOut(j), layOut(k), layOut(l), layOut(m), layOut(n), layOut(o), layOut(p);
+               TavixStringCommandsPlugin* e, HStringArray* q, Variable* r) {
+  layOut(a), layOut(b), layOut(c), layOut(d);
+  create<StrCompareCmd, StrFindCmd, StrLeftCmd, StrLengthCmd, StrMidCmd, StrReplaceCmd,
+         StrRightCmd, StrReverseFindCmd, StrTokCmd, StrTokArrayCmd, TestPrintCmd>();
   e->initialize();  // the plug-in overrides no getRuntimeClass
   delete q;         // the string array overrides only its destructor
   r->getType();
@@ -36,7 +35,7 @@ dump=$(printf '%s\n' "$probe" | "$compiler" -target x86_64-pc-windows-msvc -std=
 
 # One line per slot: class, slot, the qualified operation (and "pure").
 actual=$(printf '%s\n' "$dump" | awk '
-  /^VFTable for / { n = split($0, q, "\047"); cls = q[n - 1]; next }
+  /^VFTable for / { n = split($0, q, "\047"); cls = q[n - 1]; if (cls == "CommandFrame") cls = ""; next }
   /^$/ { cls = ""; next }
   cls != "" && /^ *[0-9]+ \| / {
     slot = $1

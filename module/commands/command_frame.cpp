@@ -2,39 +2,20 @@
 
 #include <stdint.h>
 
-void releaseCommand(Command& command) {
-  command.unref();
-}
-
-const HRuntimeClass* commandRuntimeClass() {
-  return &Command::s_classCommand;
-}
-
-void setCategory(Command& command, const char* category) {
-  command.setCommandCategory(HString(category), HString(""));
-}
-
-void declareFlagOption(Command& command, const char* name) {
-  command.addOption(CommandOption::createInstance(HString(name), 0, Variable::TypeNone, false), 0,
-                    false);
-}
-
-void declareStringOption(Command& command, const char* name) {
-  command.addOption(CommandOption::createInstance(HString(name), 1, Variable::TypeString, false), 0,
-                    false);
-}
-
-bool argumentsMatch(const TArray<Variable>& args, const Variable::VarType* expected, int count) {
-  if (args.count() != count) return false;
-  for (int i = 0; i < count; ++i) {
-    if (args[i].getType() != expected[i]) return false;
+bool argumentsFitSyntax(const TArray<Variable>& args, const char* syntax, bool optional) {
+  if (optional && args.count() == 0) return true;
+  // Each word of the syntax names one argument; its first character, its type.
+  const char* firsts[16];
+  int words = 0;
+  for (const char* at = syntax; *at != '\0' && words < 16; ++at) {
+    if (*at != ' ' && (at == syntax || at[-1] == ' ')) firsts[words++] = at;
+  }
+  if (args.count() != words) return false;
+  for (int i = 0; i < words; ++i) {
+    const Variable::VarType expected = *firsts[i] == '"' ? Variable::TypeString : Variable::TypeInt;
+    if (args[i].getType() != expected) return false;
   }
   return true;
-}
-
-int declaredOptionIndex(const CommandOption& given, int declaredCount) {
-  const int index = given.getIndex();
-  return (index >= 0 && index < declaredCount) ? index : -1;
 }
 
 size_t widenToSize(int value) {

@@ -1,4 +1,5 @@
-// The growable array of strings in which strTokArray collects its tokens.
+// The growable array of strings in which strTokArray collects its tokens: the
+// host's TArray<HString>, constructed with its grow step of 8.
 #pragma once
 
 #include "hstring.h"
@@ -6,8 +7,5 @@
 
 class HStringArray : public TArray<HString> {
  public:
-  static constexpr int kGrowStep = 8;
-
-  HStringArray();
-  ~HStringArray() override;
+  ~HStringArray() override = default;
 };

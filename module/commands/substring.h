@@ -1,79 +1,35 @@
-// strLeft, strRight, strMid and strReplace: new strings cut from, or
-// rewritten from, a script string. Script integers reach the host string
-// sign-extended to sizes (-1 becomes 2^64 - 1); the host string clamps them.
+// strLeft, strRight, strMid and strReplace: new strings cut from a string or
+// rewritten, as the host string gives them. Script integers reach the host
+// string sign-extended to sizes, which it clamps to what the string holds.
 #pragma once
 
-#include "command.h"
+#include "command_frame.h"
 
 // strLeft "string" count: the first count characters.
-class StrLeftCmd : public Command {
+class StrLeftCmd : public CommandFrame<StrLeftCmd> {
  public:
-  StrLeftCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  bool canExecuteSolo() const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrLeftCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };
 
 // strRight "string" count: the last count characters.
-class StrRightCmd : public Command {
+class StrRightCmd : public CommandFrame<StrRightCmd> {
  public:
-  StrRightCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  bool canExecuteSolo() const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrRightCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };
 
-// strMid "string" firstIndex count: count characters from firstIndex; a count of
-// exactly -1 takes everything from firstIndex to the end.
-class StrMidCmd : public Command {
+// strMid "string" firstIndex count: count characters from firstIndex; a count
+// of -1 takes everything to the end.
+class StrMidCmd : public CommandFrame<StrMidCmd> {
  public:
-  StrMidCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  bool canExecuteSolo() const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrMidCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };
 
 // strReplace "string" "subStringOld" "subStringNew": every occurrence replaced.
-class StrReplaceCmd : public Command {
+class StrReplaceCmd : public CommandFrame<StrReplaceCmd> {
  public:
-  StrReplaceCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  bool canExecuteSolo() const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrReplaceCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };

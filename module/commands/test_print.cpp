@@ -1,24 +1,14 @@
 #include "test_print.h"
 
 #include "database.h"
-#include "command_frame.h"
+#include "hstring.h"
 
-TestPrintCmd::TestPrintCmd() : Command("testPrint", "Tests print command", "") {
-  setCategory(*this, kTestingCategory);
-}
+const CommandDescription TestPrintCmd::kDescription{
+    "testPrint",        "Tests print command", "Testing", nullptr,
+    Variable::TypeNone, kHostSoloAnswer,       nullptr,   0};
 
-TestPrintCmd::~TestPrintCmd() = default;
-
-void TestPrintCmd::deleteThis() {
-  releaseCommand(*this);
-}
-
-const HRuntimeClass* TestPrintCmd::getRuntimeClass() const {
-  return commandRuntimeClass();
-}
-
-bool TestPrintCmd::execute(const TArray<CommandOption>& /*options*/,
-                           const TArray<Variable>& /*args*/, Variable& /*result*/) {
+bool TestPrintCmd::run(const TArray<CommandOption>& /*options*/, const TArray<Variable>& /*args*/,
+                       Variable& /*result*/) {
   g_db->logInfo("Simple call to logInfo");
   {
     const HString word("woohoo");
@@ -29,6 +19,6 @@ bool TestPrintCmd::execute(const TArray<CommandOption>& /*options*/,
     const HString word("woohoo");
     message.Format("Call to logInfo from HString::Format with %d arguments, %s ", 2, word.GetStr());
   }
-  g_db->logInfo(message.GetStr());
+  g_db->logInfo("%s", message.GetStr());
   return true;
 }

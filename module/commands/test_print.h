@@ -1,17 +1,12 @@
 // testPrint: writes the same three information messages to the host's log on
-// every run and never touches the result.
+// every run and never touches the result. Its argument syntax, argument check,
+// result type and solo answer are the host's defaults.
 #pragma once
 
-#include "command.h"
+#include "command_frame.h"
 
-class TestPrintCmd : public Command {
+class TestPrintCmd : public CommandFrame<TestPrintCmd> {
  public:
-  TestPrintCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-
- protected:
-  ~TestPrintCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };

@@ -4,32 +4,21 @@
 // the empty string. The remainder belongs to this one command object.
 #pragma once
 
-#include "command.h"
+#include "command_frame.h"
 #include "hstring.h"
 #include "token_scan.h"
 
-class StrTokCmd : public Command {
+class StrTokCmd : public CommandFrame<StrTokCmd> {
  public:
-  StrTokCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrTokCmd() override;
+  static const CommandDescription kDescription;
+  CommandRun run;
 
  private:
   // Takes the next token off a non-empty remainder and shortens it.
   HString nextToken(const TokenOptions& options);
-  bool remainderIsEmpty() const;
 
   // The remainder is m_remainder from m_remainderStart on; keeping the start
   // instead of cutting the string makes a whole walk linear in the text.
-  HString m_remainder;
-  int m_remainderStart;
+  HString m_remainder{""};
+  int m_remainderStart = 0;
 };

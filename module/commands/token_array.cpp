@@ -1,6 +1,7 @@
 #include "token_array.h"
 
-#include "command_frame.h"
+#include "command.h"
+#include "hstring.h"
 #include "hstring_array.h"
 #include "token_scan.h"
 
@@ -8,7 +9,7 @@ namespace {
 
 // Character-set mode: runs of delimiters anywhere separate once, so no
 // element is empty and none holds a delimiter character.
-void splitByCharSet(const HString& text, const TokenOptions& options, HStringArray& tokens) {
+void splitByCharSet(HString& text, const TokenOptions& options, HStringArray& tokens) {
   const DelimiterSet set(options);
   for (int start = 0; start < text.GetLength();) {
     const TokenSpan span = scanCharSetToken(text, start, set);
@@ -19,8 +20,7 @@ void splitByCharSet(const HString& text, const TokenOptions& options, HStringArr
 
 // Match-all mode: every occurrence ends one element, empty ones included;
 // nothing follows an occurrence that ends the text.
-void splitByDelimiterString(const HString& text, const TokenOptions& options,
-                            HStringArray& tokens) {
+void splitByDelimiterString(HString& text, const TokenOptions& options, HStringArray& tokens) {
   int start = 0;
   for (TokenSpan span; (span = scanMatchAllToken(text, start, options)).end < text.GetLength();
        start = span.next) {
@@ -31,28 +31,16 @@ void splitByDelimiterString(const HString& text, const TokenOptions& options,
 
 }  // namespace
 
-StrTokArrayCmd::StrTokArrayCmd() : Command("strTokArray", "Get HString Token Array", "") {
-  setCategory(*this, kStringCategory);
-  declareStringOption(*this, "delims");
-  declareFlagOption(*this, "matchAll");
-}
+const CommandDescription StrTokArrayCmd::kDescription =
+    stringCommand("strTokArray", "Get HString Token Array", "\"string\"", Variable::TypeStringArray,
+                  kHostSoloAnswer)
+        .withOptions(kTokenOptions);
 
-StrTokArrayCmd::~StrTokArrayCmd() = default;
-
-void StrTokArrayCmd::deleteThis() {
-  releaseCommand(*this);
-}
-
-const HRuntimeClass* StrTokArrayCmd::getRuntimeClass() const {
-  return commandRuntimeClass();
-}
-
-bool StrTokArrayCmd::execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-                             Variable& result) {
-  const HString text(args[0].getStringValue(-1));
+bool StrTokArrayCmd::run(const TArray<CommandOption>& options, const TArray<Variable>& args,
+                         Variable& result) {
+  HString text(args[0].getStringValue(-1));
   TokenOptions tokenOptions;
   if (!readTokenOptions(options, tokenOptions)) return false;
-
   HStringArray tokens;
   if (tokenOptions.matchAll) {
     splitByDelimiterString(text, tokenOptions, tokens);
@@ -63,22 +51,8 @@ bool StrTokArrayCmd::execute(const TArray<CommandOption>& options, const TArray<
     Command::logWarning("Couldn't find any string tokens");
     return true;
   }
-
   Variable value(Variable::TypeStringArray, tokens.count());
   for (int i = 0; i < tokens.count(); ++i) value.setValue(tokens[i].GetStr(), i);
   result = value;
   return true;
-}
-
-void StrTokArrayCmd::getArgSyntaxString(HString& syntax) const {
-  syntax = "\"string\"";
-}
-
-bool StrTokArrayCmd::checkArgSyntax(const TArray<Variable>& args,
-                                    const TArray<CommandOption>& /*options*/) const {
-  return argumentsAre(args, {Variable::TypeString});
-}
-
-Variable::VarType StrTokArrayCmd::getReturnType() const {
-  return Variable::TypeStringArray;
 }

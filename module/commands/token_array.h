@@ -3,20 +3,10 @@
 // any string tokens" and leaves the result as it was.
 #pragma once
 
-#include "command.h"
+#include "command_frame.h"
 
-class StrTokArrayCmd : public Command {
+class StrTokArrayCmd : public CommandFrame<StrTokArrayCmd> {
  public:
-  StrTokArrayCmd();
-  void deleteThis() override;
-  const HRuntimeClass* getRuntimeClass() const override;
-  bool execute(const TArray<CommandOption>& options, const TArray<Variable>& args,
-               Variable& result) override;
-  void getArgSyntaxString(HString& syntax) const override;
-  bool checkArgSyntax(const TArray<Variable>& args,
-                      const TArray<CommandOption>& options) const override;
-  Variable::VarType getReturnType() const override;
-
- protected:
-  ~StrTokArrayCmd() override;
+  static const CommandDescription kDescription;
+  static CommandRun run;
 };

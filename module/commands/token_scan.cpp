@@ -3,20 +3,11 @@
 #include <string.h>
 
 #include "command.h"
-#include "command_frame.h"
-
-namespace {
-
-constexpr int kDelimsOption = 0;
-constexpr int kMatchAllOption = 1;
-constexpr int kTokenOptionCount = 2;
-
-}  // namespace
 
 bool readTokenOptions(const TArray<CommandOption>& options, TokenOptions& tokenOptions) {
   tokenOptions = TokenOptions();
   for (int i = 0; i < options.count(); ++i) {
-    const int declared = declaredOptionIndex(options[i], kTokenOptionCount);
+    const int declared = options[i].getIndex();  // options not declared match neither
     if (declared == kDelimsOption) {
       tokenOptions.delims = options[i].getValue().getStringValue(-1);
       tokenOptions.delimsLength = static_cast<int>(strlen(tokenOptions.delims));

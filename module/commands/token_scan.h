@@ -5,12 +5,19 @@
 
 #include <stdint.h>
 
+#include "command_frame.h"
 #include "command_option.h"
 #include "hstring.h"
 #include "tarray.h"
 
 // Space, tab, line feed and carriage return.
 constexpr const char* kDefaultDelimiters = " \t\n\r";
+
+// The options of strTok and strTokArray, each with its declared-option index.
+enum TokenOption { kDelimsOption, kMatchAllOption };
+inline constexpr OptionDescription kTokenOptions[] = {{kDelimsOption, "delims", true},
+                                                      {kMatchAllOption, "matchAll", false}};
+static_assert(optionsInOrder(kTokenOptions), "each option's index is its place");
 
 // The options of one run: the delimiter set (or string) and the mode. The
 // delimiters are read where they stand, in the option's value or the
@@ -21,8 +28,8 @@ struct TokenOptions {
   bool matchAll = false;
 };
 
-// Reads the options given, first to last: delims (declared index 0) replaces
-// the delimiters, matchAll (index 1) sets the mode, other indexes are passed
+// Reads the options given, first to last: delims replaces the delimiters,
+// matchAll sets the mode, options the commands did not declare are passed
 // over. Starts from the default set in character-set mode. An empty delims
 // value logs "Empty string argument for -delims option" as an error and
 // returns false at once; otherwise returns true.

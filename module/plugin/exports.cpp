@@ -1,12 +1,19 @@
 // The functions the host finds by name when it loads the module.
-#include "plugin_exports.h"
+#include "plugin_base.h"
 #include "plugin_export.h"
 #include "string_commands_plugin.h"
+
+namespace {
+
+// The plug-in interface version this module is built for.
+constexpr int kApiVersion = 0x80000;
+
+}  // namespace
 
 extern "C" {
 
 TAVIX_PLUGIN_EXPORT int apiVersion() {
-  return kPluginApiVersion;
+  return kApiVersion;
 }
 
 TAVIX_PLUGIN_EXPORT bool isDebug() {

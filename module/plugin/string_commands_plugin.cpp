@@ -11,6 +11,17 @@ namespace {
 constexpr int kCommandListGrowStep = 16;
 constexpr const char* kMakerName = "Orlem";
 
+template <class CommandClass>
+Command* create() {
+  return new CommandClass();
+}
+
+// Every command of the module, in the order the host lists them.
+Command* (*const kCommands[])() = {
+    create<StrCompareCmd>, create<StrFindCmd>,     create<StrLeftCmd>,  create<StrLengthCmd>,
+    create<StrMidCmd>,     create<StrReplaceCmd>,  create<StrRightCmd>, create<StrReverseFindCmd>,
+    create<StrTokCmd>,     create<StrTokArrayCmd>, create<TestPrintCmd>};
+
 }  // namespace
 
 TavixStringCommandsPlugin::TavixStringCommandsPlugin() : m_commands(kCommandListGrowStep) {}
@@ -49,29 +60,16 @@ HString TavixStringCommandsPlugin::getReleaseString() {
   return HString("2.00");
 }
 
-template <class CommandClass>
-void TavixStringCommandsPlugin::addCommand() {
-  CommandClass* command = new CommandClass();
-  try {
-    m_commands.add(command);
-  } catch (...) {
-    command->deleteThis();  // a command whose append fails is released again, not leaked
-    throw;
-  }
-}
-
 bool TavixStringCommandsPlugin::initialize() {
-  addCommand<StrCompareCmd>();
-  addCommand<StrFindCmd>();
-  addCommand<StrLeftCmd>();
-  addCommand<StrLengthCmd>();
-  addCommand<StrMidCmd>();
-  addCommand<StrReplaceCmd>();
-  addCommand<StrRightCmd>();
-  addCommand<StrReverseFindCmd>();
-  addCommand<StrTokCmd>();
-  addCommand<StrTokArrayCmd>();
-  addCommand<TestPrintCmd>();
+  for (Command* (*const create)() : kCommands) {
+    Command* command = create();
+    try {
+      m_commands.add(command);
+    } catch (...) {
+      command->deleteThis();  // a command whose append fails is released again, not leaked
+      throw;
+    }
+  }
   return true;
 }
 

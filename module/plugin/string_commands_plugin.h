@@ -4,6 +4,8 @@
 // released through their own deleteThis.
 #pragma once
 
+#include "command.h"
+#include "hstring.h"
 #include "plugin_base.h"
 #include "plugin_export.h"
 #include "simple_array.h"
@@ -34,9 +36,6 @@ class TavixStringCommandsPlugin : public CommandPluginBase {
  private:
   TavixStringCommandsPlugin();
   ~TavixStringCommandsPlugin() override;
-
-  template <class CommandClass>
-  void addCommand();
 
   TSimpleArray<Command*> m_commands;
 };
