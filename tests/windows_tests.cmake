@@ -1,15 +1,22 @@
 # The Windows build's own tests, beside the script cases.
 
-# The module's binary interface: its export and import tables, and the
-# virtual table slots of the classes hosts call through.
+# The module's binary interface: its export table, the DLLs and the TavixCore
+# names it imports, the virtual table slots of the classes hosts call through,
+# and the layouts of what it holds by value, in both ABIs.
 find_program(TAVIX_READOBJ NAMES llvm-readobj llvm-readobj-14 REQUIRED)
+find_program(TAVIX_UNDNAME NAMES llvm-undname llvm-undname-14 REQUIRED)
 add_test(NAME export_audit
          COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh exports $<TARGET_FILE:TavixStringCmds>)
-add_test(NAME import_audit
+add_test(NAME dll_audit
          COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh imports $<TARGET_FILE:TavixStringCmds>)
-set_tests_properties(export_audit import_audit PROPERTIES ENVIRONMENT "READOBJ=${TAVIX_READOBJ}")
+add_test(NAME import_audit
+         COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/import_audit.sh pe $<TARGET_FILE:TavixStringCmds>
+                 ${CMAKE_CURRENT_SOURCE_DIR}/expected/imports.pe.txt)
+set_tests_properties(export_audit dll_audit import_audit PROPERTIES
+  ENVIRONMENT "READOBJ=${TAVIX_READOBJ};UNDNAME=${TAVIX_UNDNAME}")
 add_test(NAME slot_audit COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/slot_audit.sh)
-set_tests_properties(slot_audit PROPERTIES
+add_test(NAME layout_audit COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/layout_audit.sh)
+set_tests_properties(slot_audit layout_audit PROPERTIES
   ENVIRONMENT "CLANGXX=${CMAKE_CXX_COMPILER};MINGW_INCLUDE=${TAVIX_MINGW_ROOT}/include")
 
 # Every script case file prints, as JSON, byte for byte what the Linux console

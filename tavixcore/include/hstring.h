@@ -8,7 +8,6 @@
 #pragma once
 
 #include <stddef.h>
-#include <string.h>
 
 #include "core_export.h"
 #include "relocatable.h"
@@ -20,18 +19,21 @@ class TAVIXCORE_API HString {
   HString(const char* text);  // NOLINT(google-explicit-constructor): host API
   HString(const HString& other);
   // Takes other's text; other is left empty.
-  HString(HString&& other) noexcept : m_length(other.m_length) {
-    memcpy(m_storage, other.m_storage, sizeof(m_storage));
-    other.m_length = 0;
-    other.m_storage[0] = '\0';
-  }
+  HString(HString&& other) noexcept : m_length(other.m_length) { takeStorage(other); }
   ~HString() {
-    if (!isInline()) release();
+    if (!isInline()) Empty();
   }
 
   HString& operator=(const char* text);
   HString& operator=(const HString& other);
-  HString& operator=(HString&& other) noexcept;
+  HString& operator=(HString&& other) noexcept {
+    if (this != &other) {
+      Empty();
+      m_length = other.m_length;
+      takeStorage(other);
+    }
+    return *this;
+  }
 
   operator const char*() const { return GetStr(); }  // NOLINT(google-explicit-constructor)
   const char* GetStr() const { return isInline() ? m_storage : heapText(); }
@@ -85,10 +87,15 @@ class TAVIXCORE_API HString {
   bool isInline() const { return m_length <= kInlineLength; }
   static_assert(sizeof(char*) + sizeof(int) <= kInlineLength + 1, "a heap text's fields fit");
   char* characters();
-  char* heapText() const {
-    char* text;
-    memcpy(&text, m_storage, sizeof(text));
-    return text;
+  // The inline members below touch only the fields and call only the
+  // string's public operations, so that code built on this header refers to
+  // nothing else of the library.
+  char* heapText() const { return *reinterpret_cast<char* const*>(m_storage); }
+  // Takes other's storage bytes, whose length this string already has; other is left empty.
+  void takeStorage(HString& other) {
+    for (size_t i = 0; i < sizeof(m_storage); ++i) m_storage[i] = other.m_storage[i];
+    other.m_length = 0;
+    other.m_storage[0] = '\0';
   }
   int heapCapacity() const;
   void setHeap(char* text, int capacity);

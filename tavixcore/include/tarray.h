@@ -5,12 +5,8 @@
 
 #include <stdlib.h>
 
-#include "core_export.h"
 #include "out_of_memory.h"
 #include "relocatable.h"
-
-// Raises the standard allocation exception when an array cannot grow further.
-[[noreturn]] TAVIXCORE_API void tarrayCapacityExhausted();
 
 template <class T>
 class TArray {
@@ -74,7 +70,7 @@ class TArray {
     if (capacity < 2LL * m_capacity) capacity = 2LL * m_capacity;
     const long long limit = 0x7fffffff;
     if (capacity > limit) capacity = limit;
-    if (capacity <= m_count) tarrayCapacityExhausted();
+    if (capacity <= m_count) throw OutOfMemory();
     // Only the slots in use hold elements; the rest of the buffer is raw.
     const size_t bytes = sizeof(T) * static_cast<size_t>(capacity);
     void* buffer = nullptr;

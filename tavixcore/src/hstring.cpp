@@ -112,7 +112,7 @@ int HString::heapCapacity() const {
 }
 
 void HString::setHeap(char* text, int capacity) {
-  memcpy(m_storage, &text, sizeof(text));
+  *reinterpret_cast<char**>(m_storage) = text;
   memcpy(m_storage + sizeof(char*), &capacity, sizeof(capacity));
 }
 
@@ -172,17 +172,6 @@ HString& HString::operator=(const char* text) {
 
 HString& HString::operator=(const HString& other) {
   if (this != &other) assign(other.GetStr(), static_cast<size_t>(other.m_length));
-  return *this;
-}
-
-HString& HString::operator=(HString&& other) noexcept {
-  if (this != &other) {
-    release();
-    memcpy(m_storage, other.m_storage, sizeof(m_storage));
-    m_length = other.m_length;
-    other.m_length = 0;
-    other.m_storage[0] = '\0';
-  }
   return *this;
 }
 

@@ -1,7 +1,0 @@
-#include "tarray.h"
-
-#include "out_of_memory.h"
-
-void tarrayCapacityExhausted() {
-  throw OutOfMemory();
-}

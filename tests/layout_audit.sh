@@ -1,0 +1,60 @@
+#!/usr/bin/env bash
+# Lays out, for both C++ ABIs the module is built in (Itanium on Linux,
+# Microsoft on Windows), the framework types the module holds or reads by
+# value, and the module's own objects that embed them, and compares their
+# sizes and member offsets with layout_table.txt. The module's inline code and
+# its objects depend on these layouts; a framework release that changes them
+# needs the module rebuilt.
+set -euo pipefail
+here=$(cd "$(dirname "$0")" && pwd)
+compiler=${CLANGXX:-clang++}
+mingw=${MINGW_INCLUDE:-/usr/x86_64-w64-mingw32/include}
+resource=$("$compiler" -print-resource-dir)
+
+# Records whose members are pinned, and records whose size alone is (their
+# members are the framework's own; the module only needs their size).
+members='HString TArray<HString> HStringArray StrTokCmd TSimpleArray<Command*> TavixStringCommandsPlugin'
+sizes='Variable CommandOption Command'
+probe='
+#include "commands/hstring_array.h"
+#include "commands/token.h"
+#include "plugin/string_commands_plugin.h"
+unsigned long long probe() {
+  return sizeof(Variable) + sizeof(CommandOption) + sizeof(HStringArray) + sizeof(StrTokCmd) +
+         sizeof(TavixStringCommandsPlugin);
+}'
+
+layOut() {  # ABI-NAME TARGET FLAGS...
+  local abi=$1 target=$2
+  shift 2
+  printf '%s\n' "$probe" | "$compiler" -target "$target" -std=c++17 "$@" -I "$here/../module" \
+    -I "$here/../tavixcore/include" -x c++ -fsyntax-only -Xclang -fdump-record-layouts - |
+    awk -v abi="$abi" -v members="$members" -v sizes="$sizes" '
+      function clean(text) { gsub(/(class|struct|enum) /, "", text); gsub(/ \*/, "*", text); return text }
+      BEGIN {
+        n = split(members, m, " "); for (i = 1; i <= n; i++) want[m[i]] = "members"
+        n = split(sizes, s, " "); for (i = 1; i <= n; i++) want[s[i]] = "size"
+      }
+      /Dumping AST Record Layout/ { record = ""; named = 0; next }
+      !named && /^ *0 \| / { sub(/^ *0 \| /, ""); record = clean($0); named = 1; next }
+      record in want && want[record] == "members" && /^ *[0-9]+ \|   [^ ]/ {
+        offset = $1; sub(/^ *[0-9]+ \|   /, ""); print abi, record, offset, clean($0)
+      }
+      record in want && /\[sizeof=/ {
+        match($0, /sizeof=[0-9]+/); print abi, record, "size", substr($0, RSTART + 7, RLENGTH - 7)
+        record = ""
+      }'
+}
+
+actual=$({
+  layOut itanium x86_64-linux-gnu
+  layOut microsoft x86_64-pc-windows-msvc -fgnuc-version=12 -nostdinc \
+    -isystem "$here/../msabi/include" -isystem "$resource/include" -isystem "$mingw" -D_UCRT
+} | sort -k1,1 -k2,2 -k3,3n | uniq)
+expected=$(sed -e '/^#/d' -e '/^$/d' "$here/layout_table.txt" | sort -k1,1 -k2,2 -k3,3n | uniq)
+if ! differences=$(diff <(printf '%s\n' "$expected") <(printf '%s\n' "$actual")); then
+  echo "layout audit failed (< expected, > built):"
+  printf '%s\n' "$differences" | grep '^[<>]'
+  exit 1
+fi
+echo "layout audit passed: $(printf '%s\n' "$actual" | wc -l) sizes and offsets in both ABIs"
