@@ -6,7 +6,7 @@
 #include "tarray.h"
 
 struct LogEntry {
-  LogLevel level = LogInfo;
+  LogLevel level = LogLevel::Info;
   HString message;
 };
 

@@ -128,8 +128,8 @@ void runOneCall(FuzzedDataProvider& data) {
   bool error = false;
   bool warning = false;
   for (int i = 0; i < log.count(); ++i) {
-    error = error || log[i].level == LogError;
-    warning = warning || log[i].level == LogWarning;
+    error = error || log[i].level == LogLevel::Error;
+    warning = warning || log[i].level == LogLevel::Warning;
   }
   require(ok == !error, "execute returned false without an error, or true after one");
   if (name == "testPrint") {

@@ -1,10 +1,10 @@
 #!/usr/bin/env bash
 # Lays out, for both C++ ABIs the module is built in (Itanium on Linux,
 # Microsoft on Windows), the framework types the module holds or reads by
-# value, and the module's own objects that embed them, and compares their
-# sizes and member offsets with layout_table.txt. The module's inline code and
-# its objects depend on these layouts; a framework release that changes them
-# needs the module rebuilt.
+# value and the command that embeds one, and compares their sizes and member
+# offsets with layout_table.txt. The module's inline code and its objects
+# depend on these layouts; a framework release that changes them needs the
+# module rebuilt.
 set -euo pipefail
 here=$(cd "$(dirname "$0")" && pwd)
 compiler=${CLANGXX:-clang++}
@@ -13,15 +13,13 @@ resource=$("$compiler" -print-resource-dir)
 
 # Records whose members are pinned, and records whose size alone is (their
 # members are the framework's own; the module only needs their size).
-members='HString TArray<HString> HStringArray StrTokCmd TSimpleArray<Command*> TavixStringCommandsPlugin'
-sizes='Variable CommandOption Command'
+members='HString TArray<HString> StrTokCmd'
+sizes='HStringArray Variable CommandOption Command'
 probe='
 #include "commands/hstring_array.h"
 #include "commands/token.h"
-#include "plugin/string_commands_plugin.h"
 unsigned long long probe() {
-  return sizeof(Variable) + sizeof(CommandOption) + sizeof(HStringArray) + sizeof(StrTokCmd) +
-         sizeof(TavixStringCommandsPlugin);
+  return sizeof(Variable) + sizeof(CommandOption) + sizeof(HStringArray) + sizeof(StrTokCmd);
 }'
 
 layOut() {  # ABI-NAME TARGET FLAGS...

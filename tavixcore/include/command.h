@@ -54,8 +54,8 @@ class TAVIXCORE_API Command : public HObject {
   void unref();
 
   // printf-style messages to the host's log.
-  static void logError(const char* format, ...);
-  static void logWarning(const char* format, ...);
+  static void logError(const char* format, ...) TAVIX_PRINTF(1, 2);
+  static void logWarning(const char* format, ...) TAVIX_PRINTF(1, 2);
 
   static const HRuntimeClass s_classCommand;
 

@@ -6,7 +6,7 @@
 class TAVIXCORE_API Database {
  public:
   // printf-style; the message goes to the log sink as information.
-  void logInfo(const char* format, ...);
+  void logInfo(const char* format, ...) TAVIX_PRINTF(2, 3);
 };
 
 // The host's one database; a command may rely on it while it runs.

@@ -79,7 +79,7 @@ class TAVIXCORE_API HString {
 
   // printf-style; the string becomes the formatted text. A format that fails
   // to expand leaves the string empty.
-  void Format(const char* format, ...);
+  void Format(const char* format, ...) TAVIX_PRINTF(2, 3);
 
  private:
   static constexpr int kInlineLength = 11;

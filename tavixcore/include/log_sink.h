@@ -6,7 +6,7 @@
 
 #include "core_export.h"
 
-enum LogLevel { LogError = 0, LogWarning = 1, LogInfo = 2 };
+enum class LogLevel { Error = 0, Warning = 1, Info = 2 };
 
 typedef void (*LogSinkFn)(LogLevel level, const char* message, void* context);
 

@@ -97,15 +97,15 @@ void Command::unref() {
 void Command::logError(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  logFormatted(LogError, format, arguments);
-  va_end(arguments);
+  const ArgumentsEnd end(arguments);
+  logMessage(LogLevel::Error, FormattedText(format, arguments).text());
 }
 
 void Command::logWarning(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  logFormatted(LogWarning, format, arguments);
-  va_end(arguments);
+  const ArgumentsEnd end(arguments);
+  logMessage(LogLevel::Warning, FormattedText(format, arguments).text());
 }
 
 const char* Command::getName() const {

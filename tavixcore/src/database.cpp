@@ -14,6 +14,6 @@ Database* g_db = &g_hostDatabase;
 void Database::logInfo(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  logFormatted(LogInfo, format, arguments);
-  va_end(arguments);
+  const ArgumentsEnd end(arguments);
+  logMessage(LogLevel::Info, FormattedText(format, arguments).text());
 }

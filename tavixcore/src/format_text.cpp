@@ -2,35 +2,24 @@
 
 #include <stdio.h>
 
-void formatInto(HString& text, const char* format, va_list arguments) {
-  // The arguments may point into text itself: it changes only at the end.
-  if (format == nullptr) {
-    text.Empty();
-    return;
-  }
-  // Most texts fit a buffer on the stack, formatted in one pass; a longer
-  // one is formatted again into a heap buffer of its size.
-  char local[256];
+FormattedText::FormattedText(const char* format, va_list arguments) {
+  if (format == nullptr) return;
+  // Most texts fit the local buffer, formatted in one pass; a longer one is
+  // formatted again into a heap buffer of its size.
   va_list again;
   va_copy(again, arguments);
-  const int needed = vsnprintf(local, sizeof(local), format, arguments);
-  if (needed < 0) {
-    text.Empty();
-  } else if (static_cast<size_t>(needed) < sizeof(local)) {
-    text = local;
-  } else {
-    struct Buffer {
-      char* bytes;
-      ~Buffer() { delete[] bytes; }
-    } buffer{new char[static_cast<size_t>(needed) + 1]};
-    vsnprintf(buffer.bytes, static_cast<size_t>(needed) + 1, format, again);
-    text = buffer.bytes;
+  const ArgumentsEnd endAgain(again);
+  const int needed = vsnprintf(m_local, sizeof(m_local), format, arguments);
+  if (needed < 0) return;
+  if (static_cast<size_t>(needed) < sizeof(m_local)) {
+    m_text = m_local;
+    return;
   }
-  va_end(again);
+  m_heap = new char[static_cast<size_t>(needed) + 1];
+  vsnprintf(m_heap, static_cast<size_t>(needed) + 1, format, again);
+  m_text = m_heap;
 }
 
-void logFormatted(LogLevel level, const char* format, va_list arguments) {
-  HString message;
-  formatInto(message, format, arguments);
-  logMessage(level, message.GetStr());
+FormattedText::~FormattedText() {
+  delete[] m_heap;
 }

@@ -300,6 +300,7 @@ int HString::Replace(const char* oldText, const char* newText) {
 void HString::Format(const char* format, ...) {
   va_list arguments;
   va_start(arguments, format);
-  formatInto(*this, format, arguments);
-  va_end(arguments);
+  const ArgumentsEnd end(arguments);
+  // The arguments may point into this string: it changes only at the end.
+  *this = FormattedText(format, arguments).text();
 }

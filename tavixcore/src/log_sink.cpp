@@ -16,11 +16,11 @@ void setLogSink(LogSinkFn sink, void* context) {
 
 const char* logLevelName(LogLevel level) {
   switch (level) {
-    case LogError:
+    case LogLevel::Error:
       return "error";
-    case LogWarning:
+    case LogLevel::Warning:
       return "warning";
-    case LogInfo:
+    case LogLevel::Info:
       return "info";
   }
   return "log";
