@@ -3,13 +3,15 @@
 #include <benchmark/benchmark.h>
 #include <strings.h>
 
+#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <string_view>
 #include <vector>
 
-#include "log_sink.h"
 #include "console.h"
+#include "default_session.h"
+#include "log_sink.h"
 #include "plugin_session.h"
 #include "script_values.h"
 
@@ -24,7 +26,8 @@ static_assert(sizeof(kText) == 64, "a 64-byte text");
 PluginSession& module() {
   static PluginSession& session = []() -> PluginSession& {
     setLogSink([](LogLevel, const char*, void*) {}, nullptr);  // testPrint stays quiet
-    return sharedDefaultSession();
+    if (defaultSession() == nullptr) std::exit(2);
+    return *defaultSession();
   }();
   return session;
 }

@@ -8,6 +8,7 @@
 #include <cstdlib>
 #include <string>
 
+#include "default_session.h"
 #include "log_sink.h"
 #include "plugin_session.h"
 #include "script_values.h"
@@ -24,7 +25,8 @@ double peakResidentKiB() {
 
 int main(int argc, char** argv) {
   const long count = argc > 1 ? std::atol(argv[1]) : 10000000;
-  PluginSession& session = sharedDefaultSession();
+  if (defaultSession() == nullptr) return 2;
+  PluginSession& session = *defaultSession();
   Variable text;
   {
     std::string built;

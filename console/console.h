@@ -7,6 +7,7 @@
 
 #include "output_stream.h"
 #include "plugin_session.h"
+#include "renderer.h"
 
 enum class ConsoleMode { Plain, Json, Check };
 
@@ -15,8 +16,9 @@ class Console {
   // Results go to out, messages to err; source names where the lines come
   // from, in check reports.
   Console(PluginSession& session, ConsoleMode mode, OutputStream& out, OutputStream& err,
-          const char* source)
-      : m_session(session), m_mode(mode), m_out(out), m_err(err), m_source(source) {}
+          const char* source);
+  Console(const Console&) = delete;
+  Console& operator=(const Console&) = delete;
 
   // Runs one line of length bytes (blank and comment lines are skipped and
   // count as run). Returns false when the line was refused, execute returned
@@ -25,20 +27,15 @@ class Console {
   bool runLine(int lineNumber, const char* line, size_t length);
 
   // The plug-in's identity and every command's registration.
-  void list();
+  void list() { m_renderer.list(m_session); }
 
-  // Check mode: how many cases ran, and how many of them differed.
-  int casesRun() const { return m_casesRun; }
-  int casesDiffering() const { return m_casesDiffering; }
+  // Check mode's summary at the end of the input; nothing in other modes.
+  void summarize(bool inputReadInFull);
 
  private:
-  bool check(int lineNumber, const char* line, size_t length);
-
   PluginSession& m_session;
-  ConsoleMode m_mode;
-  OutputStream& m_out;
-  OutputStream& m_err;
-  const char* m_source;
-  int m_casesRun = 0;
-  int m_casesDiffering = 0;
+  PlainRenderer m_plain;
+  JsonRenderer m_json;
+  CheckRenderer m_check;
+  Renderer& m_renderer;
 };

@@ -1,16 +1,42 @@
 #include "line_reader.h"
 
 #include <errno.h>
+#include <stdio.h>
 #include <string.h>
 
 #include "out_of_memory.h"
 
+#if defined(_WIN32)
+#include <io.h>
+#else
+#include <unistd.h>
+#endif
+
+LineReader::LineReader(int descriptor) : m_descriptor(descriptor), m_block(new char[kBlockSize]) {}
+
+LineReader::~LineReader() {
+  delete[] m_block;
+}
+
 bool LineReader::refill() {
-  errno = 0;
   m_start = 0;
-  m_end = fread(m_block, 1, sizeof(m_block), m_file);
-  if (m_end == 0 && ferror(m_file)) m_failure = strerror(errno != 0 ? errno : EIO);
-  return m_end > 0;
+  m_end = 0;
+  for (;;) {
+#if defined(_WIN32)
+    const int got = _read(m_descriptor, m_block, static_cast<unsigned>(kBlockSize));
+#else
+    const ssize_t got = read(m_descriptor, m_block, kBlockSize);
+#endif
+    if (got > 0) {
+      m_end = static_cast<size_t>(got);
+      return true;
+    }
+    if (got == 0) return false;
+    if (errno != EINTR) {
+      m_failure = strerror(errno);
+      return false;
+    }
+  }
 }
 
 bool LineReader::next(ByteBuffer& line) {

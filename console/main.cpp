@@ -9,14 +9,18 @@
 #include <io.h>
 #include <windows.h>
 #else
+#include <signal.h>
 #include <unistd.h>
 #endif
 
 #include "byte_buffer.h"
 #include "console.h"
 #include "line_reader.h"
+#include "out_of_memory.h"
 #include "output_stream.h"
+#include "owned.h"
 #include "plugin_session.h"
+#include "system_files.h"
 #include "text_escape.h"
 
 namespace {
@@ -56,8 +60,8 @@ bool standardInputIsTerminal() {
 int fail(const char* message, const char* detail = "", const char* usage = "") {
   OutputStream err(stderr);
   err << "tavix-host: ";
-  writeMessageText(err, message);
-  writeMessageText(err, detail);
+  writeText(err, message, Escaping::Message);
+  writeText(err, detail, Escaping::Message);
   err << '\n' << usage;
   return kUsageOrLoadError;
 }
@@ -70,8 +74,10 @@ int usageError(const char* message, const char* detail = "") {
 int failure(const char* what, const char* name, const char* reason) {
   OutputStream err(stderr);
   err << "tavix-host: " << what << ' ';
-  writeMessageText(err, name);
-  err << ": " << reason << '\n';
+  writeText(err, name, Escaping::Message);
+  err << ": ";
+  writeText(err, reason, Escaping::Message);
+  err << '\n';
   return kUsageOrLoadError;
 }
 
@@ -91,8 +97,10 @@ int parseOptions(int argc, char** argv, Options& options) {
       if (i + 1 == argc) return usageError(arg, " needs a value");
       if (arg[1] == 'e') {
         options.lines.add(argv[++i]);
-      } else {
+      } else if (options.modulePath == nullptr) {
         options.modulePath = argv[++i];
+      } else {
+        return usageError("give one --module");
       }
     } else if (arg[0] == '-' && arg[1] != '\0') {
       return usageError("unknown option ", arg);
@@ -127,11 +135,11 @@ bool runLines(Console& console, LineReader& reader, OutputStream& out, const cha
 }
 
 int run(const Options& options) {
-  FILE* scriptFile = stdin;
   const bool fromScript = options.script != nullptr && strcmp(options.script, "-") != 0;
+  OwnedFile scriptFile;
   if (fromScript) {
-    scriptFile = fopen(options.script, "rb");
-    if (scriptFile == nullptr) return failure("cannot read", options.script, strerror(errno));
+    scriptFile = OwnedFile(openForReading(options.script));
+    if (!scriptFile) return failure("cannot read", options.script, strerror(errno));
   }
   const char* source = options.lines.count() > 0 ? "-e"
                        : fromScript              ? options.script
@@ -140,16 +148,13 @@ int run(const Options& options) {
   HString error;
   const HString modulePath =
       options.modulePath != nullptr ? HString(options.modulePath) : defaultModulePath();
-  PluginSession* session = PluginSession::open(modulePath, error);
-  if (session == nullptr) {
-    if (fromScript) fclose(scriptFile);
-    return fail(error);
-  }
+  const Owned<PluginSession> session = PluginSession::open(modulePath, error);
+  if (!session) return fail(error);
 
   OutputStream out(stdout);
   OutputStream err(stderr);
   Console console(*session, options.mode, out, err, source);
-  LineReader reader(scriptFile);
+  LineReader reader(fromScript ? fileno(scriptFile.get()) : 0);
   bool allOk = true;
   if (options.list) console.list();
   if (options.list && options.lines.count() == 0 && options.script == nullptr) {
@@ -163,32 +168,51 @@ int run(const Options& options) {
     const bool interactive = !fromScript && standardInputIsTerminal();
     allOk = runLines(console, reader, out, interactive ? "tavix> " : nullptr);
   }
-  if (options.mode == ConsoleMode::Check) {
-    out << source << ": ";
-    if (console.casesDiffering() == 0) {
-      out << console.casesRun() << " cases as expected\n";
-    } else {
-      out << console.casesDiffering() << " of " << console.casesRun() << " cases differ\n";
-    }
-  }
+  console.summarize(reader.failure() == nullptr);
   out.flush();
-  delete session;
-  if (fromScript) fclose(scriptFile);
   if (out.failure() != nullptr) return failure("cannot write", "standard output", out.failure());
   if (reader.failure() != nullptr) return failure("cannot read", source, reader.failure());
   return allOk ? kAllRan : kSomeFailed;
 }
 
+#if defined(_WIN32)
+extern "C" int __cdecl _configure_wide_argv(int mode);
+extern "C" wchar_t*** __cdecl __p___wargv();
+
+// The command line as UTF-8, whatever the system's code page: every name a
+// user types reaches the console whole. Kept for the whole run.
+char** utf8Arguments(int argc, TArray<HString>& texts, TArray<char*>& pointers) {
+  _configure_wide_argv(1);
+  wchar_t** wide = *__p___wargv();
+  for (int i = 0; i < argc; ++i) texts.add(utf8FromWide(wide[i]));
+  for (int i = 0; i < argc; ++i) pointers.add(const_cast<char*>(texts[i].GetStr()));
+  pointers.add(nullptr);
+  return &pointers[0];
+}
+#endif
+
 }  // namespace
 
 int main(int argc, char** argv) {
+  try {
 #if defined(_WIN32)
-  // Byte-for-byte the same output as on other systems: no CR before each LF.
-  _setmode(_fileno(stdout), _O_BINARY);
-  _setmode(_fileno(stderr), _O_BINARY);
-  _setmode(_fileno(stdin), _O_BINARY);
+    // Byte-for-byte the same output as on other systems: no CR before each LF.
+    _setmode(_fileno(stdout), _O_BINARY);
+    _setmode(_fileno(stderr), _O_BINARY);
+    _setmode(_fileno(stdin), _O_BINARY);
+    TArray<HString> texts;
+    TArray<char*> pointers;
+    argv = utf8Arguments(argc, texts, pointers);
+#else
+    // A reader that goes away makes writing fail, which the console reports,
+    // instead of ending the process silently.
+    signal(SIGPIPE, SIG_IGN);
 #endif
-  Options options;
-  const int status = parseOptions(argc, argv, options);
-  return status >= 0 ? status : run(options);
+    Options options;
+    const int status = parseOptions(argc, argv, options);
+    return status >= 0 ? status : run(options);
+  } catch (const OutOfMemory&) {
+    fputs("tavix-host: out of memory\n", stderr);
+    return kUsageOrLoadError;
+  }
 }

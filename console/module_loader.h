@@ -3,13 +3,15 @@
 #pragma once
 
 #include "hstring.h"
+#include "owned.h"
 
 class ModuleLibrary {
  public:
-  // The library at path, a file path: a bare name is a file in the current
-  // folder, never one found on the system's library search path. Null with a
-  // one-line reason in error when it cannot be loaded. The caller deletes it.
-  static ModuleLibrary* open(const char* path, HString& error);
+  // The library at path, a file path in UTF-8: a bare name is a file in the
+  // current folder, never one found on the system's library search path, and
+  // anything but a regular file is refused before it is opened ("not a
+  // regular file"). Empty, with a one-line reason in error, when it cannot be loaded.
+  static Owned<ModuleLibrary> open(const char* path, HString& error);
   ~ModuleLibrary();
   ModuleLibrary(const ModuleLibrary&) = delete;
   ModuleLibrary& operator=(const ModuleLibrary&) = delete;
@@ -26,6 +28,3 @@ class ModuleLibrary {
 
   void* m_handle;
 };
-
-// The folder of the running executable, with a trailing separator.
-HString executableDirectory();

@@ -3,21 +3,32 @@
 #include <errno.h>
 #include <string.h>
 
+OutputStream::OutputStream(FILE* file) : m_file(file), m_buffer(new char[kBufferSize]) {}
+
+OutputStream::OutputStream(const char* expected, size_t length)
+    : m_expected(expected), m_expectedLength(length) {}
+
+OutputStream::~OutputStream() {
+  flush();
+  delete[] m_buffer;
+}
+
 void OutputStream::writeSlowly(const char* bytes, size_t count) {
   if (m_file == nullptr) {
-    m_memory.append(bytes, count);
+    if (count == 0) return;
+    m_mismatch = m_mismatch || count > m_expectedLength - m_compared ||
+                 memcmp(m_expected + m_compared, bytes, count) != 0;
+    if (!m_mismatch) m_compared += count;
     return;
   }
-  if (count > sizeof(m_buffer) - m_used) {
-    flush();
-    if (count > sizeof(m_buffer)) {
-      errno = 0;
-      if (m_error == 0 && fwrite(bytes, 1, count, m_file) != count) m_error = errno ? errno : EIO;
-      return;
-    }
+  flush();
+  if (count > kBufferSize) {
+    errno = 0;
+    if (m_error == 0 && fwrite(bytes, 1, count, m_file) != count) m_error = errno ? errno : EIO;
+    return;
   }
-  memcpy(m_buffer + m_used, bytes, count);
-  m_used += count;
+  memcpy(m_buffer, bytes, count);
+  m_used = count;
 }
 
 OutputStream& OutputStream::operator<<(const char* text) {

@@ -1,25 +1,25 @@
-// Where the console writes: a stdio stream behind a buffer of its own, or
-// memory. It remembers the first failure of the stream, so that output that
-// was lost is never reported as success.
+// Where the console writes: a stdio stream behind a buffer of its own, which
+// remembers the first failure of the stream, so that output that was lost is
+// never reported as success. Or, for comparing what would be written with an
+// expected text, a stream that keeps nothing and only tells whether what was
+// written matches it byte for byte.
 #pragma once
 
 #include <stddef.h>
 #include <stdio.h>
 
-#include "byte_buffer.h"
-
 class OutputStream {
  public:
   // Buffered writes to file; flush() hands them on.
-  explicit OutputStream(FILE* file) : m_file(file), m_used(0), m_error(0) {}
-  // Collects what is written, for text().
-  OutputStream() : m_file(nullptr), m_used(0), m_error(0) {}
-  ~OutputStream() { flush(); }
+  explicit OutputStream(FILE* file);
+  // Compares what is written with the length bytes of expected.
+  OutputStream(const char* expected, size_t length);
+  ~OutputStream();
   OutputStream(const OutputStream&) = delete;
   OutputStream& operator=(const OutputStream&) = delete;
 
   void write(const char* bytes, size_t count) {
-    if (m_file != nullptr && count <= sizeof(m_buffer) - m_used) {
+    if (count <= kBufferSize - m_used && m_buffer != nullptr) {
       for (size_t i = 0; i < count; ++i) m_buffer[m_used + i] = bytes[i];
       m_used += count;
     } else {
@@ -38,18 +38,19 @@ class OutputStream {
   bool flush();
   // The reason of the first failure (strerror text), or null while there was none.
   const char* failure() const;
-
-  // In memory: what was written since the last clear().
-  const char* text() const { return m_memory.data(); }
-  size_t size() const { return m_memory.size(); }
-  void clear() { m_memory.clear(); }
+  // Comparing: whether everything written so far is the whole expected text.
+  bool matches() const { return !m_mismatch && m_compared == m_expectedLength; }
 
  private:
+  static constexpr size_t kBufferSize = 16384;
   void writeSlowly(const char* bytes, size_t count);
 
-  FILE* m_file;
-  ByteBuffer m_memory;
-  char m_buffer[16384];
-  size_t m_used;
-  int m_error;  // errno of the first failure; 0 while there was none
+  FILE* m_file = nullptr;
+  char* m_buffer = nullptr;  // on the heap, for a file
+  size_t m_used = 0;
+  int m_error = 0;  // errno of the first failure; 0 while there was none
+  const char* m_expected = nullptr;
+  size_t m_expectedLength = 0;
+  size_t m_compared = 0;
+  bool m_mismatch = false;
 };

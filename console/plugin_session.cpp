@@ -1,11 +1,10 @@
 #include "plugin_session.h"
 
-#include <stdio.h>
-#include <stdlib.h>
 #include <string.h>
 
 #include "out_of_memory.h"
 #include "plugin_exports.h"
+#include "system_files.h"
 
 namespace {
 
@@ -18,33 +17,29 @@ HString defaultModulePath() {
   const HString folder = executableDirectory();
   HString path;
   path.Format("%s%s", folder.GetStr(), kModuleFileName);
-  if (FILE* file = fopen(path, "rb")) {
-    fclose(file);
-    return path;
-  }
+  if (notRegularFile(path) == nullptr) return path;
   path.Format("%s../lib/%s", folder.GetStr(), kModuleFileName);
   return path;
 }
 
-PluginSession* PluginSession::open(const char* path, HString& error) {
-  PluginSession* session = nullptr;
-  bool loaded = false;
+Owned<PluginSession> PluginSession::open(const char* path, HString& error) {
+  Owned<PluginSession> session;
   try {
-    session = new PluginSession();
-    loaded = session->load(path, error);
+    session = Owned<PluginSession>(new PluginSession());
+    if (!session->load(path, error)) session.reset();
   } catch (const char* message) {  // E1224 from the module
     error.Format("%s: initialize failed: %s", path, message);
+    session.reset();
   } catch (const OutOfMemory&) {
     error.Format("%s: out of memory", path);
+    session.reset();
   }
-  if (loaded) return session;
-  delete session;
-  return nullptr;
+  return session;
 }
 
 bool PluginSession::load(const char* path, HString& error) {
   m_library = ModuleLibrary::open(path, error);
-  if (m_library == nullptr) return false;
+  if (!m_library) return false;
   const auto apiVersion = m_library->function<ApiVersionFn>("apiVersion");
   const auto getNumPlugins = m_library->function<GetNumPluginsFn>("getNumPlugins");
   const auto getPlugin = m_library->function<GetPluginFn>("getPlugin");
@@ -91,7 +86,6 @@ void PluginSession::adoptCommands() {
 PluginSession::~PluginSession() {
   if (m_plugin != nullptr) m_plugin->deleteThis();
   for (int i = 0; i < m_commands.count(); ++i) m_commands[i]->deleteThis();
-  delete m_library;
 }
 
 Command* PluginSession::find(const char* name) const {
@@ -99,17 +93,4 @@ Command* PluginSession::find(const char* name) const {
     if (strcmp(name, m_commands[i]->getName()) == 0) return m_commands[i];
   }
   return nullptr;
-}
-
-PluginSession& sharedDefaultSession() {
-  static PluginSession* session = [] {
-    HString error;
-    PluginSession* opened = PluginSession::open(defaultModulePath().GetStr(), error);
-    if (opened == nullptr) {
-      fprintf(stderr, "%s\n", error.GetStr());
-      exit(2);
-    }
-    return opened;
-  }();
-  return *session;
 }

@@ -6,9 +6,10 @@
 
 #include "command.h"
 #include "hstring.h"
+#include "module_loader.h"
+#include "owned.h"
 #include "plugin_base.h"
 #include "tarray.h"
-#include "module_loader.h"
 
 // The module file beside the running executable, or else in the lib folder
 // beside its bin folder, as an installed console finds it.
@@ -17,9 +18,9 @@ HString defaultModulePath();
 class PluginSession {
  public:
   // Loads path, checks apiVersion and getNumPlugins, creates the plug-in and
-  // its commands. Null with a one-line reason in error on any failure,
-  // running out of memory included. The caller deletes the session.
-  static PluginSession* open(const char* path, HString& error);
+  // its commands. Empty with a one-line reason in error on any failure,
+  // running out of memory included.
+  static Owned<PluginSession> open(const char* path, HString& error);
   ~PluginSession();
   PluginSession(const PluginSession&) = delete;
   PluginSession& operator=(const PluginSession&) = delete;
@@ -36,12 +37,8 @@ class PluginSession {
   bool load(const char* path, HString& error);
   void adoptCommands();
 
-  ModuleLibrary* m_library = nullptr;
+  Owned<ModuleLibrary> m_library;
   CommandPluginBase* m_plugin = nullptr;
   int m_apiVersion = 0;
   TArray<Command*> m_commands;
 };
-
-// The module beside the running executable, loaded on first use and kept
-// for the whole run; the program stops with the reason if it cannot load.
-PluginSession& sharedDefaultSession();

@@ -5,6 +5,10 @@
 // a bare word of a dash and a letter names an option; any other bare word is
 // a string. A word that begins with # starts a comment that runs to the end
 // of the line.
+//
+// A script case is a line with its expected outcome written beside it, after
+// the first "# =>" that begins a word outside a quoted word; where a quoted
+// word before it is malformed, after the first one from that word on.
 #pragma once
 
 #include <stddef.h>
@@ -19,14 +23,21 @@ struct ScriptWord {
   int number = 0;  // the value of an Integer word
 };
 
-// Splits a line of length bytes into words. Returns false with a one-line
-// reason on a bad quote, escape or integer, or a NUL byte anywhere.
-bool splitScriptLine(const char* line, size_t length, TArray<ScriptWord>& words, HString& error);
+// A line read once: its words, or why it cannot be run, and for a script
+// case its note. The note points into the line read.
+struct ScriptLine {
+  TArray<ScriptWord> words;  // none for a blank or comment line
+  HString error;             // why the line cannot be run; empty when it can
+  size_t caseLength = 0;     // the bytes that make the case, without blanks after them
+  bool noted = false;
+  const char* note = nullptr;  // the expected outcome, without blanks around it
+  size_t noteLength = 0;
 
-// A script case: a line with its expected outcome beside it, after the last
-// "# =>" that begins a word. Gives the length of the line to run and the
-// expected outcome (without surrounding blanks); false when there is no such note.
-bool splitExpectation(const char* line, size_t length, size_t& caseLength, HString& expected);
+  // Nothing to run: a blank line or a comment.
+  bool isEmpty() const { return words.count() == 0 && error.IsEmpty(); }
+};
 
-// True for a line with nothing to run: blank, or a comment starting with #.
-bool isSkippedLine(const char* line, size_t length);
+// Reads a line of length bytes into parsed, as a script case when cases is
+// set. A NUL byte in what is run refuses the line; so does a bad quote,
+// escape or integer, each with a one-line reason.
+void readScriptLine(const char* line, size_t length, bool cases, ScriptLine& parsed);

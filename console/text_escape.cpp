@@ -1,34 +1,64 @@
 #include "text_escape.h"
 
+#include <stdint.h>
+
 namespace {
 
 const char kHexDigits[] = "0123456789abcdef";
 
-// Which bytes each way of writing escapes. A byte's bits tell the quotings
-// that escape it; the plain bytes between escapes go out in one write.
-enum EscapedIn : unsigned char {
-  kMessage = 1,      // \t \n \r, and \xHH below 0x20 and for 0x7F
-  kScript = 2,       // as messages, and \" \\ inside the quotes
-  kScriptAscii = 4,  // as script strings, and \xHH from 0x80 up
-  kJson = 8,         // \" \\, and \u00XX below 0x20 and from 0x7F up
-};
-
-struct EscapeTable {
+// Which bytes need a look: those that do not print (controls, DEL and every
+// byte from 0x80 up), and in quotes the quote and the backslash too. The bytes
+// between them go out in one write.
+constexpr unsigned char kNotPrinting = 1;
+constexpr unsigned char kQuoting = 2;
+struct LookTable {
   unsigned char bits[256];
-  constexpr EscapeTable() : bits() {
+  constexpr LookTable() : bits() {
     for (int byte = 0; byte < 256; ++byte) {
-      const bool control = byte < 0x20 || byte == 0x7F;
-      const bool quoteOrBackslash = byte == '"' || byte == '\\';
-      bits[byte] = static_cast<unsigned char>(
-          (control ? kMessage | kScript | kScriptAscii : 0) |
-          (quoteOrBackslash ? kScript | kScriptAscii : 0) | (byte >= 0x80 ? kScriptAscii : 0) |
-          (control || quoteOrBackslash || byte >= 0x80 ? kJson : 0));
+      bits[byte] = static_cast<unsigned char>((byte < 0x20 || byte >= 0x7F ? kNotPrinting : 0) |
+                                              (byte == '"' || byte == '\\' ? kQuoting : 0));
     }
   }
 };
-constexpr EscapeTable kEscapes;
+constexpr LookTable kLooks;
 
-// The escape of a byte that needs one, in script syntax or in JSON.
+// Characters that are valid but move or hide text on a terminal.
+bool isHidingCharacter(uint32_t c) {
+  return c <= 0x9F || c == 0x061C || c == 0x200E || c == 0x200F || (c >= 0x2028 && c <= 0x202E) ||
+         (c >= 0x2066 && c <= 0x2069) || c == 0xFEFF;
+}
+
+// The length of the valid UTF-8 sequence of a printable character at at, or
+// 0 when the bytes there are not one.
+size_t printableSequence(const unsigned char* at, const unsigned char* end) {
+  size_t length = 0;
+  uint32_t c = 0;
+  uint32_t least = 0;  // the smallest character of this length: shorter forms are invalid
+  if (*at >= 0xC2 && *at <= 0xDF) {
+    length = 2;
+    c = *at & 0x1FU;
+    least = 0x80;
+  } else if (*at >= 0xE0 && *at <= 0xEF) {
+    length = 3;
+    c = *at & 0x0FU;
+    least = 0x800;
+  } else if (*at >= 0xF0 && *at <= 0xF4) {
+    length = 4;
+    c = *at & 0x07U;
+    least = 0x10000;
+  } else {
+    return 0;
+  }
+  if (static_cast<size_t>(end - at) < length) return 0;
+  for (size_t i = 1; i < length; ++i) {
+    if ((at[i] & 0xC0U) != 0x80U) return 0;
+    c = (c << 6) | (at[i] & 0x3FU);
+  }
+  const bool valid = c >= least && c <= 0x10FFFF && (c < 0xD800 || c > 0xDFFF);
+  return valid && !isHidingCharacter(c) ? length : 0;
+}
+
+// The escape of a byte: \" \\, \t \n \r by name outside JSON, \xHH or \u00XX.
 size_t escapeOf(unsigned char byte, bool json, char* escape) {
   const char named = byte == '\t' ? 't' : byte == '\n' ? 'n' : byte == '\r' ? 'r' : '\0';
   escape[0] = '\\';
@@ -44,32 +74,28 @@ size_t escapeOf(unsigned char byte, bool json, char* escape) {
   return length;
 }
 
-void writeEscaped(OutputStream& out, const char* text, EscapedIn quoting) {
-  const auto* at = reinterpret_cast<const unsigned char*>(text);
-  for (;;) {
-    const unsigned char* run = at;
-    while (*at != '\0' && (kEscapes.bits[*at] & quoting) == 0) ++at;
-    out.write(reinterpret_cast<const char*>(run), static_cast<size_t>(at - run));
-    if (*at == '\0') return;
-    char escape[8];
-    out.write(escape, escapeOf(*at++, quoting == kJson, escape));
-  }
-}
-
 }  // namespace
 
-void writeScriptString(OutputStream& out, const char* text, bool escapeHighBytes) {
-  out << '"';
-  writeEscaped(out, text, escapeHighBytes ? kScriptAscii : kScript);
-  out << '"';
-}
-
-void writeJsonString(OutputStream& out, const char* text) {
-  out << '"';
-  writeEscaped(out, text, kJson);
-  out << '"';
-}
-
-void writeMessageText(OutputStream& out, const char* text) {
-  writeEscaped(out, text, kMessage);
+void writeText(OutputStream& out, const char* text, size_t length, Escaping escaping) {
+  const bool quoted = escaping != Escaping::Message;
+  const bool keepsCharacters = escaping == Escaping::Message || escaping == Escaping::Script;
+  const unsigned char looks = quoted ? kNotPrinting | kQuoting : kNotPrinting;
+  const auto* at = reinterpret_cast<const unsigned char*>(text);
+  const auto* end = at + length;
+  if (quoted) out << '"';
+  while (at < end) {
+    const unsigned char* run = at;
+    while (at < end && (kLooks.bits[*at] & looks) == 0) ++at;
+    out.write(reinterpret_cast<const char*>(run), static_cast<size_t>(at - run));
+    if (at == end) break;
+    const size_t character = *at >= 0x80 && keepsCharacters ? printableSequence(at, end) : 0;
+    if (character > 0) {
+      out.write(reinterpret_cast<const char*>(at), character);
+      at += character;
+      continue;
+    }
+    char escape[8];
+    out.write(escape, escapeOf(*at++, escaping == Escaping::Json, escape));
+  }
+  if (quoted) out << '"';
 }

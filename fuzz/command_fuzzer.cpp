@@ -8,9 +8,9 @@
 #include <cstring>
 #include <string>
 
+#include "fuzz_support.h"
 #include "log_capture.h"
 #include "plugin_session.h"
-#include "fuzz_support.h"
 
 namespace {
 
@@ -56,8 +56,8 @@ int optionIndex(const Command& command, const char* name) {
 
 // The delimiters the token commands should use for these options, and the
 // mode; false when an empty delims value must make them fail.
-bool tokenOptions(const Command& command, const TArray<CommandOption>& options,
-                  std::string& delims, bool& matchAll) {
+bool tokenOptions(const Command& command, const TArray<CommandOption>& options, std::string& delims,
+                  bool& matchAll) {
   const int delimsIndex = optionIndex(command, "delims");
   const int matchAllIndex = optionIndex(command, "matchAll");
   delims = " \t\n\r";
@@ -93,7 +93,7 @@ void checkTokens(const Command& command, const std::string& input,
 }
 
 void runOneCall(FuzzedDataProvider& data) {
-  PluginSession& s = sharedDefaultSession();
+  PluginSession& s = fuzzedSession();
   Command& command = s.command(data.ConsumeIntegralInRange(0, s.commandCount() - 1));
   const std::string name = command.getName();
 

@@ -6,12 +6,12 @@
 #include <stdio.h>
 #include <string.h>
 
+#include "module_loader.h"
+#include "module_malloc_hook.h"
 #include "out_of_memory.h"
 #include "plugin_exports.h"
-#include "module_loader.h"
 #include "plugin_session.h"
 #include "script_values.h"
-#include "module_malloc_hook.h"
 
 namespace {
 
@@ -20,6 +20,13 @@ int g_failures = 0;
 void expect(bool holds, const char* what) {
   printf("%s: %s\n", holds ? "ok" : "FAILED", what);
   g_failures += holds ? 0 : 1;
+}
+
+// The plug-in's command of that name.
+Command& commandNamed(CommandPluginBase& plugin, const char* name) {
+  for (int i = 0;; ++i) {
+    if (strcmp(plugin.getCommand(i)->getName(), name) == 0) return *plugin.getCommand(i);
+  }
 }
 
 // n copies of c.
@@ -33,8 +40,8 @@ Variable repeated(char c, int n) {
 
 int main() {
   HString error;
-  ModuleLibrary* library = ModuleLibrary::open(defaultModulePath(), error);
-  if (library == nullptr) {
+  Owned<ModuleLibrary> library = ModuleLibrary::open(defaultModulePath(), error);
+  if (!library) {
     printf("FAILED: %s\n", error.GetStr());
     return 1;
   }
@@ -66,7 +73,7 @@ int main() {
   bool caughtOutOfMemory = false;
   try {
     Variable result;
-    plugin->getCommand(5)->execute(TArray<CommandOption>(), args, result);
+    commandNamed(*plugin, "strReplace").execute(TArray<CommandOption>(), args, result);
   } catch (const OutOfMemory&) {
     caughtOutOfMemory = true;
   }
@@ -76,6 +83,5 @@ int main() {
   for (int i = 0; i < plugin->getNumCommands(); ++i) commands.add(plugin->getCommand(i));
   plugin->deleteThis();
   for (int i = 0; i < commands.count(); ++i) commands[i]->deleteThis();
-  delete library;
   return g_failures == 0 ? 0 : 1;
 }

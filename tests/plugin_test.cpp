@@ -5,11 +5,12 @@
 
 #include <climits>
 #include <regex>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
-#include "plugin_exports.h"
 #include "module_loader.h"
+#include "plugin_exports.h"
 #include "plugin_session.h"
 #include "script_values.h"
 
@@ -23,7 +24,7 @@ class PluginTest : public ::testing::Test {
  protected:
   void SetUp() override {
     HString error;
-    library.reset(ModuleLibrary::open(defaultModulePath(), error));
+    library = ModuleLibrary::open(defaultModulePath(), error);
     ASSERT_TRUE(library) << error.GetStr();
     getPlugin = library->function<GetPluginFn>("getPlugin");
     ASSERT_NE(getPlugin, nullptr);
@@ -37,9 +38,17 @@ class PluginTest : public ::testing::Test {
     return plugin;
   }
 
-  std::unique_ptr<ModuleLibrary> library;
+  Owned<ModuleLibrary> library;
   GetPluginFn getPlugin = nullptr;
 };
+
+// The command of that script name among commands.
+Command& named(const std::vector<Command*>& commands, const char* name) {
+  for (Command* command : commands) {
+    if (std::string(command->getName()) == name) return *command;
+  }
+  throw std::runtime_error(name);
+}
 
 // Runs a command on string arguments, with options of these declared indexes
 // whose values are ",".
@@ -105,7 +114,7 @@ TEST_F(PluginTest, InitializeAppendsTheElevenCommandsInOrderEachTime) {
 TEST_F(PluginTest, CommandsOutliveThePluginAndAreReleasedByReference) {
   std::vector<Command*> commands;
   initialised(commands)->deleteThis();
-  Command& length = *commands[3];
+  Command& length = named(commands, "strLength");
   EXPECT_EQ(run(length, {"four"}).getIntValue(-1), 4);
   length.ref();  // a reference the host still holds keeps it through deleteThis
   length.deleteThis();
@@ -130,8 +139,10 @@ TEST_F(PluginTest, CommandsDeclareWhatOnlyAHostSees) {
     }
   }
   // Options with indexes a command never declared are passed over.
-  EXPECT_EQ(run(*commands[0], {"ABC", "abc"}, {1, -1, 31, 32, INT_MIN}).getIntValue(-1), 'A' - 'a');
-  EXPECT_EQ(run(*commands[9], {"a,b,c d"}, {2, -1, 33, INT_MIN}).getCount(), 2);
+  EXPECT_EQ(
+      run(named(commands, "strCompare"), {"ABC", "abc"}, {1, -1, 31, 32, INT_MIN}).getIntValue(-1),
+      'A' - 'a');
+  EXPECT_EQ(run(named(commands, "strTokArray"), {"a,b,c d"}, {2, -1, 33, INT_MIN}).getCount(), 2);
   plugin->deleteThis();
   for (Command* c : commands) c->deleteThis();
 }

@@ -36,7 +36,7 @@ class Searcher {
   }
 
   // First match at or after from, or npos. from must be <= textLength.
-  size_t find(const char* text, size_t textLength, size_t from) const {
+  size_t firstMatchIn(const char* text, size_t textLength, size_t from) const {
     if (m_length == 0) return from;
     if (m_length > textLength - from) return npos;
     if (m_length <= kShortNeedle) {
@@ -231,7 +231,7 @@ int HString::Find(const char* sub, int start) const {
   const char* needle = sub == nullptr ? kEmptyText : sub;
   const Searcher searcher(needle, strlen(needle));
   const size_t hit =
-      searcher.find(GetStr(), static_cast<size_t>(m_length), static_cast<size_t>(start));
+      searcher.firstMatchIn(GetStr(), static_cast<size_t>(m_length), static_cast<size_t>(start));
   return hit == Searcher::npos ? -1 : static_cast<int>(hit);
 }
 
@@ -276,7 +276,7 @@ int HString::Replace(const char* oldText, const char* newText) {
 
   // Counting first refuses a result too long for a string before building any of it.
   size_t replaced = 0;
-  for (size_t hit, from = 0; (hit = searcher.find(text, length, from)) != Searcher::npos;
+  for (size_t hit, from = 0; (hit = searcher.firstMatchIn(text, length, from)) != Searcher::npos;
        from = hit + oldLength) {
     ++replaced;
   }
@@ -285,7 +285,7 @@ int HString::Replace(const char* oldText, const char* newText) {
   HString result;
   char* out = result.prepare(resultLength);
   size_t from = 0;
-  for (size_t hit; (hit = searcher.find(text, length, from)) != Searcher::npos;
+  for (size_t hit; (hit = searcher.firstMatchIn(text, length, from)) != Searcher::npos;
        from = hit + oldLength) {
     memcpy(out, text + from, hit - from);
     out += hit - from;
