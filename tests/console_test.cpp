@@ -2,7 +2,10 @@
 // check mode that the script cases rely on. What a line does is in cases/.
 #include <fcntl.h>
 #include <gtest/gtest.h>
+#include <poll.h>
+#include <pty.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -53,12 +56,15 @@ std::string hostFolder() {
 
 // How a run is started, beyond its arguments.
 struct HostStart {
-  std::string input;      // standard input
-  std::string inPath;     // or this file as standard input
-  std::string outPath;    // or this file as standard output
-  bool closeOut = false;  // or standard output closed
-  std::string folder;     // the working folder
+  std::string input;        // standard input
+  std::string inPath;       // or this file as standard input
+  bool closeIn = false;     // or standard input closed
+  std::string outPath;      // or this file as standard output
+  bool closeOut = false;    // or standard output closed
+  bool brokenPipe = false;  // or a pipe that nobody reads
+  std::string folder;       // the working folder
   rlim_t addressSpace = RLIM_INFINITY;
+  unsigned seconds = 30;  // a run that takes longer is ended by a signal
 };
 
 // Runs tavix-host; exit status -1 when a signal ended it.
@@ -67,6 +73,8 @@ HostRun runHost(const std::vector<std::string>& args, const HostStart& start) {
   const std::string out = start.outPath.empty() ? privateFolder() + "out" : start.outPath;
   const std::string err = privateFolder() + "err";
   const std::string host = hostFolder() + "tavix-host";
+  int pipeEnds[2] = {-1, -1};  // the reading end is closed before anything is written
+  if (start.brokenPipe && (pipe(pipeEnds) != 0 || close(pipeEnds[0]) != 0)) std::abort();
   const pid_t child = fork();
   if (child == 0) {
     std::vector<char*> argv{const_cast<char*>(host.c_str())};
@@ -75,13 +83,17 @@ HostRun runHost(const std::vector<std::string>& args, const HostStart& start) {
     dup2(open(in.c_str(), O_RDONLY), 0);
     dup2(open(out.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600), 1);
     dup2(open(err.c_str(), O_WRONLY | O_CREAT | O_TRUNC, 0600), 2);
+    if (start.closeIn) close(0);
     if (start.closeOut) close(1);
+    if (start.brokenPipe) dup2(pipeEnds[1], 1);
+    alarm(start.seconds);
     if (!start.folder.empty() && chdir(start.folder.c_str()) != 0) _exit(126);
     const rlimit limit{start.addressSpace, start.addressSpace};
     setrlimit(RLIMIT_AS, &limit);
     execv(host.c_str(), argv.data());
     _exit(127);
   }
+  if (start.brokenPipe) close(pipeEnds[1]);
   int raw = 0;
   waitpid(child, &raw, 0);
   return HostRun{WIFEXITED(raw) ? WEXITSTATUS(raw) : -1, start.outPath.empty() ? readFile(out) : "",
@@ -111,6 +123,7 @@ TEST(ConsoleTest, UsageAndLoadErrorsExitWithTwo) {
   for (const std::vector<std::string>& args : {std::vector<std::string>{"--bogus"},
                                                {"-e"},
                                                {"--json", "--check"},
+                                               {"--module", "a", "--module", "b"},
                                                {"a", "b"},
                                                {"-e", "strLength a", writeFile("script", "")}}) {
     const HostRun run = runHost(args);
@@ -147,6 +160,45 @@ TEST(ConsoleTest, CheckModeNamesEachCaseThatDiffers) {
   const HostRun passing = runHost({"--check", "-e", "strLength \"a\" # => 1"});
   EXPECT_EQ(passing.status, 0);
   EXPECT_EQ(passing.out, "-e: 1 cases as expected\n");
+}
+
+TEST(ConsoleTest, CheckModeReportsNotesAndNamesEscapedAndComparesNotesWhole) {
+  const char text[] = "strLength \"abc\"  # => \x1b[2J\x07\nstrLength \"abc\"  # => 3\0junk\n";
+  const std::string cases = writeFile("x\x1b[7my.tavix", std::string(text, sizeof(text) - 1));
+  const std::string name = privateFolder() + "x\\x1b[7my.tavix";
+  EXPECT_EQ(runHost({"--check", cases}).all(),
+            "1|" + name + ":1: strLength \"abc\"\n  expected: \\x1b[2J\\x07\n  actual:   3\n" +
+                name + ":2: strLength \"abc\"\n  expected: 3\\x00junk\n  actual:   3\n" + name +
+                ": 2 of 2 cases differ\n|");
+}
+
+TEST(ConsoleTest, CheckModeNeverCallsInputItCouldNotReadAsExpected) {
+  EXPECT_EQ(runHost({"--check", privateFolder()}).all(),
+            "2|" + privateFolder() + ": reading stopped after 0 cases, 0 of them differing\n" +
+                "|tavix-host: cannot read " + privateFolder() + ": Is a directory\n");
+  HostStart closed;
+  closed.closeIn = true;
+  EXPECT_EQ(runHost({"--check"}, closed).all(),
+            "2|standard input: reading stopped after 0 cases, 0 of them differing\n"
+            "|tavix-host: cannot read standard input: Bad file descriptor\n");
+#if !defined(__SANITIZE_ADDRESS__)  // a memory limit leaves no room for the shadow memory
+  HostStart limited;
+  limited.addressSpace = 96 << 20;
+  const std::string script = writeFile(
+      "long.tavix", "strLength abc # => 3\nstrLength \"" + std::string(120 << 20, 'x') + "\"\n");
+  EXPECT_EQ(runHost({"--check", script}, limited).all(),
+            "2|" + script +
+                ": reading stopped after 1 cases, 0 of them differing\n|tavix-host: cannot read " +
+                script + ": line 2 is too long to hold in memory\n");
+  // A result far larger than memory allows to describe twice is compared as it is described.
+  limited.addressSpace = 256 << 20;
+  const std::string huge =
+      writeFile("huge.tavix", "strLeft \"" + std::string(30 << 20, '\x01') +
+                                  "\" -1 # => nothing\nstrLength abc # => 3\n");
+  const HostRun run = runHost({"--check", huge}, limited);
+  EXPECT_EQ(run.status, 1);
+  EXPECT_EQ(run.out.substr(run.out.size() - 22), ": 1 of 2 cases differ\n");
+#endif
 }
 
 // A line that runs out of memory fails alone; the run goes on.
@@ -187,6 +239,61 @@ TEST(ConsoleTest, InputThatCannotBeReadOrOutputWrittenIsNeverSuccess) {
   start.closeOut = true;
   EXPECT_EQ(runHost({"-e", "strLength abc"}, start).all(),
             "2||tavix-host: cannot write standard output: Bad file descriptor\n");
+  HostStart broken;
+  broken.brokenPipe = true;
+  EXPECT_EQ(runHost({"-e", "strLength abc"}, broken).all(),
+            "2||tavix-host: cannot write standard output: Broken pipe\n");
+}
+
+// Whatever the limit on its memory, the console starts and runs, or ends
+// with a message; a signal never ends it.
+TEST(ConsoleTest, StartingUnderATightMemoryLimitEndsWithAMessage) {
+#if !defined(__SANITIZE_ADDRESS__)
+  std::vector<std::string> args;
+  for (int i = 0; i < 60000; ++i) args.insert(args.end(), {"-e", "strLength abc"});
+  for (rlim_t limit = 5 << 20; limit < 12 << 20; limit += 256 << 10) {
+    HostStart tight;
+    tight.addressSpace = limit;
+    const HostRun run = runHost(args, tight);
+    SCOPED_TRACE(limit);
+    EXPECT_NE(run.status, -1);
+    if (run.status == 2) {
+      EXPECT_EQ(run.err.substr(0, 12), "tavix-host: ");
+    }
+  }
+#endif
+}
+
+// What a terminal shows until the text wanted arrives, or 10 seconds pass.
+std::string readTerminalUntil(int terminal, const std::string& wanted) {
+  std::string shown;
+  pollfd readable{terminal, POLLIN, 0};
+  while (shown.find(wanted) == std::string::npos && poll(&readable, 1, 10000) == 1) {
+    char bytes[256];
+    const ssize_t got = read(terminal, bytes, sizeof(bytes));
+    if (got <= 0) break;
+    shown.append(bytes, static_cast<size_t>(got));
+  }
+  return shown;
+}
+
+TEST(ConsoleTest, AtATerminalEachLineRunsAtEnterAndOneEndOfInputEnds) {
+  const std::string host = hostFolder() + "tavix-host";
+  int terminal = -1;
+  const pid_t child = forkpty(&terminal, nullptr, nullptr, nullptr);
+  if (child == 0) {
+    alarm(30);
+    execl(host.c_str(), host.c_str(), static_cast<char*>(nullptr));
+    _exit(127);
+  }
+  EXPECT_NE(readTerminalUntil(terminal, "tavix> ").find("tavix> "), std::string::npos);
+  ASSERT_EQ(write(terminal, "strLength abc\n", 14), 14);
+  EXPECT_NE(readTerminalUntil(terminal, "3\r\ntavix> ").find("3\r\ntavix> "), std::string::npos);
+  ASSERT_EQ(write(terminal, "\x04", 1), 1);
+  int raw = 0;
+  waitpid(child, &raw, 0);
+  close(terminal);
+  EXPECT_TRUE(WIFEXITED(raw) && WEXITSTATUS(raw) == 0) << raw;
 }
 
 TEST(ConsoleTest, AModulePathIsAFilePath) {
@@ -197,11 +304,28 @@ TEST(ConsoleTest, AModulePathIsAFilePath) {
   EXPECT_EQ(runHost({"--module", "mine.hll", "-e", "strLength abc"}, here).all(), "0|3\n|");
   EXPECT_EQ(runHost({"--module", "libm.so.6", "-e", "strLength abc"}, here).all(),
             "2||tavix-host: cannot load libm.so.6: No such file or directory\n");
+  // Only a regular file is loaded: a pipe would wait for a writer forever.
+  ASSERT_EQ(mkfifo((privateFolder() + "fifo").c_str(), 0600), 0);
+  EXPECT_EQ(runHost({"--module", "fifo", "-e", "strLength abc"}, here).all(),
+            "2||tavix-host: cannot load fifo: not a regular file\n");
 }
 
-TEST(ConsoleTest, MessagesShowBytesThatDoNotPrintEscaped) {
-  EXPECT_EQ(runHost({}, "\x1b[31mRED\tx\nstrLength \"a\x01\"\n").all(),
-            "1|2\n|line 1: unknown command \\x1b[31mRED\n");
+// Printable characters in UTF-8 are shown as they are, in any language;
+// controls (C0, DEL, C1), invalid UTF-8, bidirectional controls and a stray
+// byte-order mark are shown byte by byte as \xHH.
+TEST(ConsoleTest, MessagesAndResultsShowOnlyPrintableCharactersAsTheyAre) {
+  EXPECT_EQ(
+      runHost(
+          {},
+          "\x1b[31mRED\tx\nstrLength \"a\x01\"\n\xc2\x9b"
+          "2J \xe2\x80\xae\xef\xbb\xbfx\n"
+          "strLeft "
+          "\"\xc3\xa9\xe6\x97\xa5\x9b\xc2\x9b\xe2\x80\xae\xef\xbb\xbf\x7f\xc0\xaf\xed\xa0\x80\" "
+          "-1\n")
+          .all(),
+      "1|2\n\"\xc3\xa9\xe6\x97\xa5\\x9b\\xc2\\x9b\\xe2\\x80\\xae\\xef\\xbb\\xbf\\x7f\\xc0\\xaf"
+      "\\xed\\xa0\\x80\"\n|line 1: unknown command \\x1b[31mRED\n"
+      "line 3: unknown command \\xc2\\x9b2J\n");
 }
 
 }  // namespace

@@ -32,3 +32,8 @@ foreach(case_file ${case_files})
                    -P ${PROJECT_SOURCE_DIR}/cmake/compare_output.cmake)
   set_tests_properties(same_as_linux.${topic} PROPERTIES SKIP_REGULAR_EXPRESSION "not built yet")
 endforeach()
+
+# The console with names outside the code page, load errors in words and long paths.
+add_test(NAME windows_console
+         COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/windows_console.sh $<TARGET_FILE:TavixStringCmds>
+                 ${host_command})
