@@ -27,10 +27,10 @@ for finder in "-DCMAKE_PREFIX_PATH=$work/sdk" "-DTAVIXCORE_ROOT=$work/sdk"; do
       { "${host[@]}" --module "$module/TavixStringCmds.hll" --check "$cases"; exit 1; }
   done
   if [ "$platform" = windows ]; then
-    bash tests/import_audit.sh pe "$module/TavixStringCmds.hll" tests/expected/imports.pe.txt
+    bash tests/import_audit.sh pe "$module/TavixStringCmds.hll" tests/expected/imports.txt
   else
     bash tests/import_audit.sh elf "$module/TavixStringCmds.hll" "$work/sdk/lib/TavixCore.so" \
-      tests/expected/imports.elf.txt
+      tests/expected/imports.txt
   fi
 done
 echo "the module alone ($platform): every script case as expected, with both ways of finding the SDK"

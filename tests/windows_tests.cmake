@@ -11,7 +11,7 @@ add_test(NAME dll_audit
          COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh imports $<TARGET_FILE:TavixStringCmds>)
 add_test(NAME import_audit
          COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/import_audit.sh pe $<TARGET_FILE:TavixStringCmds>
-                 ${CMAKE_CURRENT_SOURCE_DIR}/expected/imports.pe.txt)
+                 ${CMAKE_CURRENT_SOURCE_DIR}/expected/imports.txt)
 set_tests_properties(export_audit dll_audit import_audit PROPERTIES
   ENVIRONMENT "READOBJ=${TAVIX_READOBJ};UNDNAME=${TAVIX_UNDNAME}")
 add_test(NAME slot_audit COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/slot_audit.sh)
