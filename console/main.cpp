@@ -20,6 +20,7 @@
 #include "output_stream.h"
 #include "owned.h"
 #include "plugin_session.h"
+#include "script_blocks.h"
 #include "system_files.h"
 #include "text_escape.h"
 
@@ -31,7 +32,8 @@ constexpr int kUsageOrLoadError = 2;
 
 const char kUsage[] =
     "usage: tavix-host [--module PATH] [--json | --check] [--list] [-e LINE]... [SCRIPT]\n"
-    "  Runs script lines from SCRIPT, from each -e LINE, or from standard input.\n"
+    "  Runs script lines from SCRIPT, from each -e LINE, or from standard input; from\n"
+    "  a SCRIPT named *.md, the lines of its ```tavix blocks.\n"
     "  --module PATH  the module to load (default: TavixStringCmds.hll beside tavix-host,\n"
     "                 or in ../lib)\n"
     "  --json         one JSON object per executed line\n"
@@ -116,17 +118,21 @@ int parseOptions(int argc, char** argv, Options& options) {
   return -1;
 }
 
-// Runs every line of reader; the prompt is shown before each line when given.
-// Stops early when standard output fails.
-bool runLines(Console& console, LineReader& reader, OutputStream& out, const char* prompt) {
+// Runs every line of reader, or, from Markdown, the lines of its tavix blocks;
+// the prompt is shown before each line when given. Stops early when standard
+// output fails.
+bool runLines(Console& console, LineReader& reader, OutputStream& out, const char* prompt,
+              bool markdown) {
   bool allOk = true;
   ByteBuffer line;
+  ScriptBlocks blocks;
   for (int lineNumber = 1;; ++lineNumber) {
     if (prompt != nullptr) {
       out << prompt;
       out.flush();
     }
     if (!reader.next(line)) break;
+    if (markdown && !blocks.holdsScript(line.data(), line.size())) continue;
     allOk = console.runLine(lineNumber, line.data(), line.size()) && allOk;
     if (out.failure() != nullptr) break;
   }
@@ -166,7 +172,8 @@ int run(const Options& options) {
     }
   } else {
     const bool interactive = !fromScript && standardInputIsTerminal();
-    allOk = runLines(console, reader, out, interactive ? "tavix> " : nullptr);
+    allOk = runLines(console, reader, out, interactive ? "tavix> " : nullptr,
+                     fromScript && isMarkdownName(options.script));
   }
   console.summarize(reader.failure() == nullptr);
   out.flush();
