@@ -14,15 +14,22 @@ set(TAVIX_MINGW_ROOT /usr/x86_64-w64-mingw32 CACHE PATH "mingw-w64's C headers a
 
 execute_process(COMMAND ${CMAKE_CXX_COMPILER} -print-resource-dir
                 OUTPUT_VARIABLE _resource OUTPUT_STRIP_TRAILING_WHITESPACE)
-# -fgnuc-version: mingw-w64's headers do not parse without it.
+# -fgnuc-version: mingw-w64's headers do not parse without it. Hardened as the
+# Microsoft toolchain hardens by default: stack cookies (/GS) and
+# control-flow guard; CodeView debug information for PDBs.
 set(_flags "-fgnuc-version=12 -nostdinc -isystem ${CMAKE_CURRENT_LIST_DIR}/../msabi/include \
 -isystem ${_resource}/include -isystem ${TAVIX_MINGW_ROOT}/include -D_UCRT \
--fno-stack-protector -fno-threadsafe-statics -gcodeview -Wno-unused-command-line-argument")
+-fstack-protector-strong -Xclang -cfguard -fno-threadsafe-statics -gcodeview \
+-Wno-unused-command-line-argument")
 set(CMAKE_C_FLAGS_INIT "${_flags}")
 set(CMAKE_CXX_FLAGS_INIT "${_flags}")
 # No default libraries: the UCRT's import libraries and msabi/ stand in for
-# them; the entry points are msabi/'s.
-set(_link "-fuse-ld=lld-link -nostdlib -Xlinker /nodefaultlib")
+# them; the entry points are msabi/'s. Control-flow guard's tables and CET
+# shadow-stack compatibility; a PDB named in the binary without its folder;
+# a timestamp derived from the content (/Brepro), so that a build repeats byte
+# for byte.
+set(_link "-fuse-ld=lld-link -nostdlib -Xlinker /nodefaultlib -Xlinker /guard:cf \
+-Xlinker /cetcompat -Xlinker /debug -Xlinker /pdbaltpath:%_PDB% -Xlinker /Brepro")
 set(CMAKE_EXE_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:mainCRTStartup")
 set(CMAKE_SHARED_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:_DllMainCRTStartup")
 set(CMAKE_MODULE_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:_DllMainCRTStartup")

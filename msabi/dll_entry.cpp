@@ -4,8 +4,13 @@
 
 #include "startup.h"
 
-extern "C" BOOL WINAPI _DllMainCRTStartup(HINSTANCE, DWORD reason, LPVOID) {
-  if (reason == DLL_PROCESS_ATTACH) startModule();
+extern "C" __attribute__((no_stack_protector)) BOOL WINAPI _DllMainCRTStartup(HINSTANCE,
+                                                                              DWORD reason,
+                                                                              LPVOID) {
+  if (reason == DLL_PROCESS_ATTACH) {
+    __security_init_cookie();
+    startModule();
+  }
   if (reason == DLL_PROCESS_DETACH) finishModule();
   return TRUE;
 }

@@ -25,7 +25,8 @@ void __cdecl finishAtExit() {
 
 }  // namespace
 
-extern "C" void mainCRTStartup() {
+extern "C" __attribute__((no_stack_protector)) void mainCRTStartup() {
+  __security_init_cookie();
   _set_app_type(kConsoleApp);
   _configure_narrow_argv(kUnexpandedArguments);
   _initialize_narrow_environment();

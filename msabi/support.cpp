@@ -1,13 +1,16 @@
 // Symbols the compiler refers to in the Microsoft C++ ABI that the static
 // part of its runtime would provide.
-#include <stdlib.h>
 
 // Referred to by every object that uses floating point.
 extern "C" int _fltused = 0x9875;
 
+// The UCRT's terminate(), which calls the handler a host installed with
+// set_terminate (a crash reporter, say) before it ends the process.
+extern "C" [[noreturn]] void __cdecl terminate();
+
 // Called where an exception would leave a noexcept function.
 extern "C" [[noreturn]] void __std_terminate() {
-  abort();
+  terminate();
 }
 
 namespace {

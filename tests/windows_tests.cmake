@@ -37,3 +37,16 @@ endforeach()
 add_test(NAME windows_console
          COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/windows_console.sh $<TARGET_FILE:TavixStringCmds>
                  ${host_command})
+
+# Shipping as the Microsoft toolchain ships: hardened, versioned, with symbols;
+# no hidden state per thread in the module; and a smashed stack stops the process.
+foreach(binary TavixStringCmds TavixCore tavix-host)
+  add_test(NAME shipping_audit.${binary}
+           COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh shipping $<TARGET_FILE:${binary}>)
+  set_tests_properties(shipping_audit.${binary} PROPERTIES ENVIRONMENT "READOBJ=${TAVIX_READOBJ}")
+endforeach()
+add_test(NAME thread_state_audit
+         COMMAND bash ${CMAKE_CURRENT_SOURCE_DIR}/pe_audit.sh thread-state $<TARGET_FILE:TavixStringCmds>)
+set_tests_properties(thread_state_audit PROPERTIES ENVIRONMENT "READOBJ=${TAVIX_READOBJ}")
+add_executable(stack_smash_test stack_smash_test.cpp)
+add_test(NAME stack_smash_test COMMAND stack_smash_test)
