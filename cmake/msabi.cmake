@@ -26,10 +26,12 @@ set(CMAKE_CXX_FLAGS_INIT "${_flags}")
 # No default libraries: the UCRT's import libraries and msabi/ stand in for
 # them; the entry points are msabi/'s. Control-flow guard's tables and CET
 # shadow-stack compatibility; a PDB named in the binary without its folder;
-# a timestamp derived from the content (/Brepro), so that a build repeats byte
-# for byte.
+# a timestamp derived from the content (/Brepro), and paths in the PDB taken
+# from one fixed base rather than the build folder, so that a build repeats
+# byte for byte wherever it is made.
 set(_link "-fuse-ld=lld-link -nostdlib -Xlinker /nodefaultlib -Xlinker /guard:cf \
--Xlinker /cetcompat -Xlinker /debug -Xlinker /pdbaltpath:%_PDB% -Xlinker /Brepro")
+-Xlinker /cetcompat -Xlinker /debug -Xlinker /pdbaltpath:%_PDB% -Xlinker /Brepro \
+-Xlinker /pdbsourcepath:C:/TavixStringCmds")
 set(CMAKE_EXE_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:mainCRTStartup")
 set(CMAKE_SHARED_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:_DllMainCRTStartup")
 set(CMAKE_MODULE_LINKER_FLAGS_INIT "${_link} -Xlinker /entry:_DllMainCRTStartup")

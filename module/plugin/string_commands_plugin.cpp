@@ -45,7 +45,11 @@ HString TavixStringCommandsPlugin::getPublisherName() {
 }
 
 HString TavixStringCommandsPlugin::getBuildDate() {
+#if defined(TAVIX_BUILD_DATE)
+  return HString(TAVIX_BUILD_DATE);  // the day SOURCE_DATE_EPOCH named, for a build that repeats
+#else
   return HString(__DATE__);
+#endif
 }
 
 HString TavixStringCommandsPlugin::getVersionString() {
