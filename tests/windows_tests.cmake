@@ -50,3 +50,34 @@ add_test(NAME thread_state_audit
 set_tests_properties(thread_state_audit PROPERTIES ENVIRONMENT "READOBJ=${TAVIX_READOBJ}")
 add_executable(stack_smash_test stack_smash_test.cpp)
 add_test(NAME stack_smash_test COMMAND stack_smash_test)
+
+# The boundary test again, with the host program and TavixCore taking their
+# exception runtime from vcruntime140.dll (which wine provides), while the
+# module keeps the UCRT's: both runtimes in one process, throwing across.
+find_program(TAVIX_DLLTOOL NAMES llvm-dlltool llvm-dlltool-14 REQUIRED)
+set(vcruntime_lib ${CMAKE_CURRENT_BINARY_DIR}/vcruntime140.lib)
+add_custom_command(OUTPUT ${vcruntime_lib}
+                   COMMAND ${TAVIX_DLLTOOL} -m i386:x86-64 -d ${CMAKE_CURRENT_SOURCE_DIR}/vcruntime140.def
+                           -l ${vcruntime_lib}
+                   DEPENDS vcruntime140.def)
+add_custom_target(vcruntime140_import DEPENDS ${vcruntime_lib})
+get_target_property(core_sources TavixCore SOURCES)
+list(FILTER core_sources INCLUDE REGEX "\\.cpp$")
+list(TRANSFORM core_sources PREPEND ${PROJECT_SOURCE_DIR}/tavixcore/)
+add_library(TavixCore_vcruntime SHARED ${core_sources})
+target_include_directories(TavixCore_vcruntime PUBLIC ${PROJECT_SOURCE_DIR}/tavixcore/include)
+target_compile_definitions(TavixCore_vcruntime PRIVATE TAVIXCORE_BUILDING)
+target_link_libraries(TavixCore_vcruntime PRIVATE ${vcruntime_lib})
+add_dependencies(TavixCore_vcruntime vcruntime140_import)
+set_target_properties(TavixCore_vcruntime PROPERTIES
+  OUTPUT_NAME TavixCore PREFIX ""
+  RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin/vcruntime
+  ARCHIVE_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/lib/vcruntime
+  PDB_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin/vcruntime)
+add_executable(boundary_test_vcruntime boundary_test.cpp)
+target_link_libraries(boundary_test_vcruntime PRIVATE ${vcruntime_lib} tavix_test_support)
+add_dependencies(boundary_test_vcruntime TavixCore_vcruntime TavixStringCmds vcruntime140_import)
+set_target_properties(boundary_test_vcruntime PROPERTIES
+  RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin/vcruntime)
+add_test(NAME boundary_test.vcruntime
+         COMMAND boundary_test_vcruntime $<TARGET_FILE:TavixStringCmds> --vcruntime)

@@ -6,7 +6,8 @@
 
 #if defined(_WIN32)
 #include <windows.h>
-extern "C" void* __imp_malloc;  // this program's own import slot for malloc
+extern "C" void* __imp_malloc;  // this program's own import slots
+extern "C" void* __imp_realloc;
 #else
 #include <link.h>
 #include <sys/mman.h>
@@ -16,27 +17,41 @@ extern "C" void* __imp_malloc;  // this program's own import slot for malloc
 namespace {
 
 using MallocFn = void* (*)(size_t);
+using ReallocFn = void* (*)(void*, size_t);
 
 MallocFn g_realMalloc = nullptr;
+ReallocFn g_realRealloc = nullptr;
 size_t g_failingSize = 0;  // 0: none fails
 
-void* hookedMalloc(size_t bytes) {
-  if (bytes == g_failingSize) {
-    g_failingSize = 0;
-    return nullptr;
-  }
-  return g_realMalloc(bytes);
+// Whether a request of this size is the one to fail.
+bool failsNow(size_t bytes) {
+  if (bytes != g_failingSize) return false;
+  g_failingSize = 0;
+  return true;
 }
 
-// The module calls malloc through one word of its image that the loader
-// filled with malloc's address: its import slot. Finds it in [from, to),
-// which may hold the redzones AddressSanitizer puts between globals.
-__attribute__((no_sanitize_address)) void** findSlot(uintptr_t from, uintptr_t to) {
+void* hookedMalloc(size_t bytes) {
+  return failsNow(bytes) ? nullptr : g_realMalloc(bytes);
+}
+
+void* hookedRealloc(void* block, size_t bytes) {
+  return failsNow(bytes) ? nullptr : g_realRealloc(block, bytes);
+}
+
+// The address of a function as the module's import slot holds it; on
+// Windows &malloc would name this program's import thunk instead.
+void* importedAddress(bool reallocation) {
 #if defined(_WIN32)
-  void* const target = __imp_malloc;  // &malloc would name this program's import thunk
+  return reallocation ? __imp_realloc : __imp_malloc;
 #else
-  void* const target = reinterpret_cast<void*>(&malloc);
+  return reallocation ? reinterpret_cast<void*>(&realloc) : reinterpret_cast<void*>(&malloc);
 #endif
+}
+
+// The module calls a function through one word of its image that the loader
+// filled with the function's address: its import slot. Finds it in [from,
+// to), which may hold the redzones AddressSanitizer puts between globals.
+__attribute__((no_sanitize_address)) void** findSlot(uintptr_t from, uintptr_t to, void* target) {
   for (uintptr_t at = (from + sizeof(void*) - 1) & ~(sizeof(void*) - 1); at + sizeof(void*) <= to;
        at += sizeof(void*)) {
     if (*reinterpret_cast<void**>(at) == target) return reinterpret_cast<void**>(at);
@@ -46,12 +61,13 @@ __attribute__((no_sanitize_address)) void** findSlot(uintptr_t from, uintptr_t t
 
 #if defined(_WIN32)
 
-void** findMallocImport(const char* moduleFileName) {
+void** findImport(const char* moduleFileName, void* target) {
   const auto base = reinterpret_cast<uintptr_t>(GetModuleHandleA(moduleFileName));
   if (base == 0) return nullptr;
   const auto* dos = reinterpret_cast<const IMAGE_DOS_HEADER*>(base);
   const auto* nt = reinterpret_cast<const IMAGE_NT_HEADERS*>(base + dos->e_lfanew);
-  return findSlot(base + nt->OptionalHeader.SizeOfHeaders, base + nt->OptionalHeader.SizeOfImage);
+  return findSlot(base + nt->OptionalHeader.SizeOfHeaders, base + nt->OptionalHeader.SizeOfImage,
+                  target);
 }
 
 void writeSlot(void** slot, void* value) {
@@ -65,6 +81,7 @@ void writeSlot(void** slot, void* value) {
 
 struct Search {
   const char* fileName;
+  void* target;
   void** slot;
 };
 
@@ -78,13 +95,13 @@ int searchObject(dl_phdr_info* info, size_t, void* data) {
     const ElfW(Phdr)& segment = info->dlpi_phdr[i];
     if (segment.p_type != PT_LOAD || (segment.p_flags & PF_W) == 0) continue;
     const uintptr_t start = info->dlpi_addr + segment.p_vaddr;
-    search->slot = findSlot(start, start + segment.p_memsz);
+    search->slot = findSlot(start, start + segment.p_memsz, search->target);
   }
   return 1;
 }
 
-void** findMallocImport(const char* moduleFileName) {
-  Search search{moduleFileName, nullptr};
+void** findImport(const char* moduleFileName, void* target) {
+  Search search{moduleFileName, target, nullptr};
   dl_iterate_phdr(searchObject, &search);
   return search.slot;
 }
@@ -101,15 +118,21 @@ void writeSlot(void** slot, void* value) {
 }  // namespace
 
 ModuleMallocHook::ModuleMallocHook(const char* moduleFileName) {
-  m_slot = findMallocImport(moduleFileName);
-  if (m_slot == nullptr) return;
-  g_realMalloc = reinterpret_cast<MallocFn>(*m_slot);
+  m_mallocSlot = findImport(moduleFileName, importedAddress(false));
+  m_reallocSlot = findImport(moduleFileName, importedAddress(true));
+  if (!installed()) return;
+  g_realMalloc = reinterpret_cast<MallocFn>(*m_mallocSlot);
+  g_realRealloc = reinterpret_cast<ReallocFn>(*m_reallocSlot);
   g_failingSize = 0;
-  writeSlot(m_slot, reinterpret_cast<void*>(&hookedMalloc));
+  writeSlot(m_mallocSlot, reinterpret_cast<void*>(&hookedMalloc));
+  writeSlot(m_reallocSlot, reinterpret_cast<void*>(&hookedRealloc));
 }
 
 ModuleMallocHook::~ModuleMallocHook() {
-  if (m_slot != nullptr) writeSlot(m_slot, reinterpret_cast<void*>(g_realMalloc));
+  if (installed()) {
+    writeSlot(m_mallocSlot, reinterpret_cast<void*>(g_realMalloc));
+    writeSlot(m_reallocSlot, reinterpret_cast<void*>(g_realRealloc));
+  }
   g_failingSize = 0;
 }
 

@@ -1,6 +1,6 @@
-// Redirects the malloc that a loaded module imports, so that a test can make
-// the module's own heap requests fail, as a host under memory pressure would
-// see them. Other code keeps the real malloc.
+// Redirects the malloc and realloc that a loaded module imports, so that a
+// test can make the module's own heap requests fail, as a host under memory
+// pressure would see them. Other code keeps the real functions.
 #pragma once
 
 #include <stddef.h>
@@ -13,13 +13,14 @@ class ModuleMallocHook {
   ModuleMallocHook(const ModuleMallocHook&) = delete;
   ModuleMallocHook& operator=(const ModuleMallocHook&) = delete;
 
-  // Whether the module's malloc import was found and redirected.
-  bool installed() const { return m_slot != nullptr; }
-  // The module's next malloc of exactly this many bytes returns null; other
-  // requests, and later ones, succeed. (Where the module's operator new
-  // calls malloc through the same import, its requests pass here too.)
+  // Whether the module's malloc and realloc imports were found and redirected.
+  bool installed() const { return m_mallocSlot != nullptr && m_reallocSlot != nullptr; }
+  // The module's next malloc or realloc of exactly this many bytes returns
+  // null; other requests, and later ones, succeed. (Where the module's
+  // operator new calls malloc through the same import, its requests pass here too.)
   void failNextRequestOf(size_t bytes);
 
  private:
-  void** m_slot = nullptr;
+  void** m_mallocSlot = nullptr;
+  void** m_reallocSlot = nullptr;
 };
