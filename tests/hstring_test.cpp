@@ -19,7 +19,7 @@ TEST(HStringTest, IndexingAppendingAndAssigningStayInBounds) {
   EXPECT_EQ(constText.ReverseFind('\0'), -1);
   EXPECT_EQ(constText[2], '\0');
   EXPECT_EQ(constText[-1], '\0');
-  text[5] = 'x';  // lands in scratch, not in the string
+  text[5] = 'x';  // lands in the string's spare byte, outside its text
   text[-3] = 'y';
   text += '\0';
   for (int i = 0; i < 1000; ++i) text += 'c';
@@ -28,14 +28,16 @@ TEST(HStringTest, IndexingAppendingAndAssigningStayInBounds) {
   EXPECT_STREQ(text.GetStr(), "cc");
 }
 
-// Texts of up to 11 bytes live inside the string, longer ones on the heap;
-// every way in or out of either keeps the text.
+// Texts of up to 10 bytes live inside the string, longer ones on the heap;
+// every way in or out of either keeps the text, and so does a write out of range.
 TEST(HStringTest, TextsKeepTheirBytesAcrossTheInlineLimit) {
   for (const size_t length : {0, 1, 10, 11, 12, 13, 23, 24, 100}) {
     SCOPED_TRACE(length);
     const std::string text(length, 'x');
     HString built;
     for (size_t i = 0; i < length; ++i) built += 'x';
+    built[static_cast<int>(length)] = '!';
+    built[-1] = '!';
     HString copy(built);
     HString moved(static_cast<HString&&>(copy));
     EXPECT_EQ(std::string(copy.GetStr()) + "|" + std::to_string(copy.GetLength()), "|0");

@@ -1,7 +1,7 @@
 // The host's 8-bit string. It always holds a NUL-terminated text without
 // embedded NUL bytes; positions are 0-based ints, lengths never exceed INT_MAX.
 // Every operation stays inside the string whatever position or size it is
-// given. Texts of up to 11 bytes are held inside the object, without any
+// given. Texts of up to 10 bytes are held inside the object, without any
 // allocation; longer ones on the heap. The layout is part of the host's
 // binary interface (modules hold strings by value), and the few accessors
 // that only read it are inline.
@@ -41,8 +41,9 @@ class TAVIXCORE_API HString {
   bool IsEmpty() const { return m_length == 0; }
   void Empty();
 
-  // Positions outside 0..length-1 read as NUL. The writable form returns a
-  // scratch byte for them, so a write there changes no string.
+  // Positions outside 0..length-1 read as NUL. For them the writable form
+  // returns a spare byte of this string's own, outside its text, so that a
+  // write there changes no text and no other string (nor another thread's).
   char operator[](int index) const;
   char& operator[](int index);
 
@@ -82,10 +83,10 @@ class TAVIXCORE_API HString {
   void Format(const char* format, ...) TAVIX_PRINTF(2, 3);
 
  private:
-  static constexpr int kInlineLength = 11;
+  static constexpr int kInlineLength = 10;
 
   bool isInline() const { return m_length <= kInlineLength; }
-  static_assert(sizeof(char*) + sizeof(int) <= kInlineLength + 1, "a heap text's fields fit");
+  static_assert(sizeof(char*) + sizeof(int) <= kInlineLength + 2, "a heap text's fields fit");
   char* characters();
   // The inline members below touch only the fields and call only the
   // string's public operations, so that code built on this header refers to
@@ -105,9 +106,10 @@ class TAVIXCORE_API HString {
   char* prepare(size_t length);
   void release();
 
-  // Bytes 0-11: the text and its NUL while the length is at most 11;
-  // otherwise the heap text's address (0-7) and capacity (8-11), the
-  // characters it can hold without its NUL.
+  // Bytes 0-11: the text and its NUL while the length is at most 10, and a
+  // spare byte at 11; otherwise the heap text's address (0-7) and capacity
+  // (8-11), the characters it can hold without its NUL. A heap text has one
+  // spare byte after its NUL too.
   alignas(8) char m_storage[12];
   int m_length;
 };

@@ -131,7 +131,7 @@ char* HString::prepare(size_t length) {
   if (length <= kInlineLength) {
     release();
   } else if (isInline() || static_cast<size_t>(heapCapacity()) < length) {
-    char* text = new char[length + 1];
+    char* text = new char[length + 2];
     release();
     setHeap(text, static_cast<int>(length));
   }
@@ -156,7 +156,7 @@ void HString::assign(const char* text, size_t length) {
   } else if (!isInline() && length <= static_cast<size_t>(heapCapacity())) {
     memmove(heapText(), text, length);
   } else {
-    char* copy = new char[length + 1];
+    char* copy = new char[length + 2];
     memcpy(copy, text, length);
     release();
     setHeap(copy, static_cast<int>(length));
@@ -185,10 +185,9 @@ char HString::operator[](int index) const {
 
 char& HString::operator[](int index) {
   if (index >= 0 && index < m_length) return characters()[index];
-  // One scratch byte for the whole host: commands run on the host's one thread.
-  static char scratch;
-  scratch = '\0';
-  return scratch;
+  char& spare = isInline() ? m_storage[kInlineLength + 1] : heapText()[heapCapacity() + 1];
+  spare = '\0';
+  return spare;
 }
 
 HString& HString::operator+=(char c) {
@@ -202,7 +201,7 @@ HString& HString::operator+=(char c) {
   // Doubling keeps a run of appends linear in the final length.
   if (m_length >= INT_MAX - 1) throw OutOfMemory();
   const int capacity = m_length > INT_MAX / 2 - 1 ? INT_MAX - 1 : m_length * 2;
-  char* grown = new char[static_cast<size_t>(capacity) + 1];
+  char* grown = new char[static_cast<size_t>(capacity) + 2];
   memcpy(grown, GetStr(), static_cast<size_t>(m_length));
   grown[m_length] = c;
   grown[m_length + 1] = '\0';
