@@ -202,18 +202,10 @@ TEST(ConsoleTest, RunningOutOfMemoryFailsTheLineAndTheRunGoesOn) {
   limited.addressSpace = 256 << 20;
   limited.input = replacing(8192, 32768);
   EXPECT_EQ(runHost({}, limited).all(), "1|3\n|line 1: out of memory\n");
-
-  limited.addressSpace = 96 << 20;
-  const std::string script =
-      writeFile("long.tavix", "strLength abc\nstrLength \"" + std::string(120 << 20, 'x') + "\"\n");
-  EXPECT_EQ(runHost({script}, limited).all(),
-            "2|3\n|tavix-host: cannot read " + script + ": line 2 is too long to hold in memory\n");
 #endif
 }
 
 TEST(ConsoleTest, InputThatCannotBeReadOrOutputWrittenIsNeverSuccess) {
-  EXPECT_EQ(runHost({privateFolder()}).all(),
-            "2||tavix-host: cannot read " + privateFolder() + ": Is a directory\n");
   HostStart start;
   start.inPath = privateFolder();
   EXPECT_EQ(runHost({}, start).all(),
@@ -240,7 +232,7 @@ TEST(ConsoleTest, StartingUnderATightMemoryLimitEndsWithAMessage) {
 #if !defined(__SANITIZE_ADDRESS__)
   std::vector<std::string> args;
   for (int i = 0; i < 60000; ++i) args.insert(args.end(), {"-e", "strLength abc"});
-  for (rlim_t limit = 5 << 20; limit < 12 << 20; limit += 256 << 10) {
+  for (rlim_t limit = 5 << 20; limit < 12 << 20; limit += 512 << 10) {
     HostStart tight;
     tight.addressSpace = limit;
     const HostRun run = runHost(args, tight);

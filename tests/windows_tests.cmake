@@ -53,13 +53,16 @@ add_test(NAME stack_smash_test COMMAND stack_smash_test)
 
 # The boundary test again, with the host program and TavixCore taking their
 # exception runtime from vcruntime140.dll (which wine provides), while the
-# module keeps the UCRT's: both runtimes in one process, throwing across.
+# module keeps the UCRT's: both runtimes in one process, throwing across. The
+# import library names only the exception runtime's entries.
 find_program(TAVIX_DLLTOOL NAMES llvm-dlltool llvm-dlltool-14 REQUIRED)
+set(vcruntime_def ${CMAKE_CURRENT_BINARY_DIR}/vcruntime140.def)
 set(vcruntime_lib ${CMAKE_CURRENT_BINARY_DIR}/vcruntime140.lib)
+file(WRITE ${vcruntime_def} "LIBRARY vcruntime140.dll\nEXPORTS\n_CxxThrowException\n"
+                            "__CxxFrameHandler3\n__C_specific_handler\n")
 add_custom_command(OUTPUT ${vcruntime_lib}
-                   COMMAND ${TAVIX_DLLTOOL} -m i386:x86-64 -d ${CMAKE_CURRENT_SOURCE_DIR}/vcruntime140.def
-                           -l ${vcruntime_lib}
-                   DEPENDS vcruntime140.def)
+                   COMMAND ${TAVIX_DLLTOOL} -m i386:x86-64 -d ${vcruntime_def} -l ${vcruntime_lib}
+                   DEPENDS ${vcruntime_def})
 add_custom_target(vcruntime140_import DEPENDS ${vcruntime_lib})
 get_target_property(core_sources TavixCore SOURCES)
 list(FILTER core_sources INCLUDE REGEX "\\.cpp$")

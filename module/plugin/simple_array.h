@@ -7,16 +7,10 @@
 #include <stdlib.h>
 #include <string.h>
 
-// The general heap behind TSimpleArray; tests substitute one that fails.
-struct MallocHeap {
-  static void* allocate(size_t bytes) { return malloc(bytes); }
-  static void release(void* block) { free(block); }
-};
-
 // Thrown, as a const char*, when the buffer cannot grow.
 constexpr const char* kSimpleArrayOutOfMemory = "E1224: Out of memory in TSimpleArray::addSpace";
 
-template <class T, class Heap = MallocHeap>
+template <class T>
 class TSimpleArray {
  public:
   explicit TSimpleArray(int growStep)
@@ -25,7 +19,7 @@ class TSimpleArray {
   TSimpleArray& operator=(const TSimpleArray&) = delete;
 
   virtual ~TSimpleArray() {
-    if (m_buffer != nullptr) Heap::release(m_buffer);
+    if (m_buffer != nullptr) free(m_buffer);
   }
 
   // Appends value unchanged and returns true. When the heap has no room, throws
@@ -41,17 +35,16 @@ class TSimpleArray {
   int capacity() const { return m_capacity; }
   // The element at index, or a value-initialised T (null) outside 0..count-1.
   T at(int index) const { return (index >= 0 && index < m_count) ? m_buffer[index] : T(); }
-  const T* data() const { return m_buffer; }
 
  private:
   void addSpace() {
     const int step = m_growStep > 0 ? m_growStep : 1;
     if (m_capacity > INT_MAX - step) throw kSimpleArrayOutOfMemory;
     const int capacity = m_capacity + step;
-    T* buffer = static_cast<T*>(Heap::allocate(sizeof(T) * static_cast<size_t>(capacity)));
+    T* buffer = static_cast<T*>(malloc(sizeof(T) * static_cast<size_t>(capacity)));
     if (buffer == nullptr) throw kSimpleArrayOutOfMemory;
     if (m_count > 0) memcpy(buffer, m_buffer, sizeof(T) * static_cast<size_t>(m_count));
-    if (m_buffer != nullptr) Heap::release(m_buffer);
+    if (m_buffer != nullptr) free(m_buffer);
     m_buffer = buffer;
     m_capacity = capacity;
   }
