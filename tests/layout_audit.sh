@@ -6,10 +6,7 @@
 # depend on these layouts; a framework release that changes them needs the
 # module rebuilt.
 set -euo pipefail
-here=$(cd "$(dirname "$0")" && pwd)
-compiler=${CLANGXX:-clang++}
-mingw=${MINGW_INCLUDE:-/usr/x86_64-w64-mingw32/include}
-resource=$("$compiler" -print-resource-dir)
+source "$(dirname "$0")/abi_probe.sh"
 
 # Records whose members are pinned, and records whose size alone is (their
 # members are the framework's own; the module only needs their size).
@@ -22,12 +19,9 @@ unsigned long long probe() {
   return sizeof(Variable) + sizeof(CommandOption) + sizeof(HStringArray) + sizeof(StrTokCmd);
 }'
 
-layOut() {  # ABI-NAME TARGET FLAGS...
-  local abi=$1 target=$2
-  shift 2
-  printf '%s\n' "$probe" | "$compiler" -target "$target" -std=c++17 "$@" -I "$here/../module" \
-    -I "$here/../tavixcore/include" -x c++ -fsyntax-only -Xclang -fdump-record-layouts - |
-    awk -v abi="$abi" -v members="$members" -v sizes="$sizes" '
+layOut() {  # ABI
+  compileProbe "$1" -fdump-record-layouts |
+    awk -v abi="$1" -v members="$members" -v sizes="$sizes" '
       function clean(text) { gsub(/(class|struct|enum) /, "", text); gsub(/ \*/, "*", text); return text }
       BEGIN {
         n = split(members, m, " "); for (i = 1; i <= n; i++) want[m[i]] = "members"
@@ -46,9 +40,8 @@ layOut() {  # ABI-NAME TARGET FLAGS...
 
 # A row the two ABIs share is written once, as "both".
 actual=$({
-  layOut itanium x86_64-linux-gnu
-  layOut microsoft x86_64-pc-windows-msvc -fgnuc-version=12 -nostdinc \
-    -isystem "$here/../msabi/include" -isystem "$resource/include" -isystem "$mingw" -D_UCRT
+  layOut itanium
+  layOut microsoft
 } | awk '{ abi = $1; $1 = ""; row = substr($0, 2); seen[row] = seen[row] abi }
          END { for (row in seen) print (seen[row] == "itaniummicrosoft" ? "both" : seen[row]), row }' |
   sort -k2,2 -k3,3n -k1,1 | uniq)

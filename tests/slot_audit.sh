@@ -3,10 +3,7 @@
 # and compares every class's virtual table slots with slot_table.txt: hosts
 # call the plug-in and the commands through these slots.
 set -euo pipefail
-here=$(cd "$(dirname "$0")" && pwd)
-compiler=${CLANGXX:-clang++}
-mingw=${MINGW_INCLUDE:-/usr/x86_64-w64-mingw32/include}
-resource=$("$compiler" -print-resource-dir)
+source "$(dirname "$0")/abi_probe.sh"
 
 # The probe makes the compiler lay out the virtual table of every class a host
 # calls through, by calling one virtual operation through a pointer of each.
@@ -29,9 +26,7 @@ void layOutAll(HObject* a, Command* b, HomCorePluginBase* c, CommandPluginBase* 
   delete q;         // the string array overrides only its destructor
   r->getType();
 }'
-dump=$(printf '%s\n' "$probe" | "$compiler" -target x86_64-pc-windows-msvc -std=c++17 -fno-rtti \
-  -fgnuc-version=12 -nostdinc -isystem "$here/../msabi/include" -isystem "$resource/include" \
-  -isystem "$mingw" -D_UCRT -I "$here/../module" -I "$here/../tavixcore/include" -x c++ -S -o /dev/null -Xclang -fdump-vtable-layouts -)
+dump=$(compileProbe microsoft -fdump-vtable-layouts)
 
 # One line per slot: class, slot, the qualified operation (and "pure").
 actual=$(printf '%s\n' "$dump" | awk '
