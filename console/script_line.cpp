@@ -49,18 +49,18 @@ class WordSplitter {
   WordSplitter(const char* line, size_t length, char* text)
       : m_line(line), m_length(length), m_text(text) {}
 
-  // Adds the line's words, up to a comment; false with the reason at the
-  // first word that cannot be read.
-  bool split(TArray<ScriptWord>& words, HString& error) {
+  // Adds the line's words, up to a comment; stops with the reason in error at
+  // the first word that cannot be read.
+  void split(TArray<ScriptWord>& words, HString& error) {
     for (size_t pos = 0;;) {
       while (pos < m_length && isBlank(m_line[pos])) ++pos;
-      if (pos == m_length || m_line[pos] == '#') return true;  // the rest is a comment
+      if (pos == m_length || m_line[pos] == '#') return;  // the rest is a comment
       ScriptWord word;
       if (m_line[pos] == '"') {
-        if (!readQuoted(pos, error)) return false;
+        if (!readQuoted(pos, error)) return;
         word.text = m_text;
       } else if (!readBare(pos, word, error)) {
-        return false;
+        return;
       }
       words.add(word);
     }

@@ -113,6 +113,10 @@ TEST(ConsoleTest, ResultsGoToStandardOutputMessagesToStandardErrorInOrder) {
                 .all(),
             "1|3\n\"a\"\n1\n|warning: Couldn't find any string tokens\n"
             "error: Second argument cannot be an empty string\nline 5: unknown command nope\n");
+  const std::string longText(20000, 'x');  // a result longer than the output's buffer
+  EXPECT_EQ(runHost({"-e", "strLeft " + longText + " -1"}).out, '"' + longText + "\"\n");
+  const std::string help = runHost({"--help"}, "strLength abc\n").out;  // help, and nothing run
+  EXPECT_EQ(help.substr(help.size() - 9), "commands\n");
   EXPECT_EQ(runHost({"-e", "strLength abc", "-e", "strMid abcdef 2 -1"}).all(), "0|3\n\"cdef\"\n|");
 }
 
@@ -159,6 +163,10 @@ TEST(ConsoleTest, CheckModeReportsEachCaseThatDiffersEscaped) {
                 ": 4 of 5 cases differ\n|");
   EXPECT_EQ(runHost({"--check", "-e", "strLength \"a\" # => 1"}).all(),
             "0|-e: 1 cases as expected\n|");
+  // From Markdown, only the lines of ```tavix blocks are cases.
+  const std::string page =
+      writeFile("page.md", "```tavixx\nx # => 9\n```\n```tavix\nstrLength a # => 1\n```\n");
+  EXPECT_EQ(runHost({"--check", page}).all(), "0|" + page + ": 1 cases as expected\n|");
 }
 
 TEST(ConsoleTest, CheckModeNeverCallsInputItCouldNotReadAsExpected) {
@@ -302,10 +310,11 @@ TEST(ConsoleTest, MessagesAndResultsShowOnlyPrintableCharactersAsTheyAre) {
           "2J \xe2\x80\xae\xef\xbb\xbfx\n"
           "strLeft "
           "\"\xc3\xa9\xe6\x97\xa5\x9b\xc2\x9b\xe2\x80\xae\xef\xbb\xbf\x7f\xc0\xaf\xed\xa0\x80\" "
-          "-1\n")
+          "-1\nstrLeft \"\xdf\xbf\xe0\xa0\x80\xf0\x90\x80\x80\xe0\x80\x80\" -1\n")
           .all(),
       "1|2\n\"\xc3\xa9\xe6\x97\xa5\\x9b\\xc2\\x9b\\xe2\\x80\\xae\\xef\\xbb\\xbf\\x7f\\xc0\\xaf"
-      "\\xed\\xa0\\x80\"\n|line 1: unknown command \\x1b[31mRED\n"
+      "\\xed\\xa0\\x80\"\n\"\xdf\xbf\xe0\xa0\x80\xf0\x90\x80\x80\\xe0\\x80\\x80\"\n|line 1: "
+      "unknown command \\x1b[31mRED\n"
       "line 3: unknown command \\xc2\\x9b2J\n");
 }
 
