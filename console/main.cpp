@@ -16,6 +16,7 @@
 #include "byte_buffer.h"
 #include "console.h"
 #include "line_reader.h"
+#include "memory_reserve.h"
 #include "out_of_memory.h"
 #include "output_stream.h"
 #include "owned.h"
@@ -44,7 +45,11 @@ struct Options {
   const char* modulePath = nullptr;
   ConsoleMode mode = ConsoleMode::Plain;
   bool list = false;
-  TArray<const char*> lines;
+  // The -e lines stay where the command line holds them: each follows an "-e"
+  // among the arguments, so that however many there are, none is copied.
+  int argc = 0;
+  char** argv = nullptr;
+  int lineCount = 0;
   const char* script = nullptr;
 };
 
@@ -98,7 +103,8 @@ int parseOptions(int argc, char** argv, Options& options) {
     } else if (strcmp(arg, "--module") == 0 || strcmp(arg, "-e") == 0) {
       if (i + 1 == argc) return usageError(arg, " needs a value");
       if (arg[1] == 'e') {
-        options.lines.add(argv[++i]);
+        ++options.lineCount;
+        ++i;
       } else if (options.modulePath == nullptr) {
         options.modulePath = argv[++i];
       } else {
@@ -112,7 +118,9 @@ int parseOptions(int argc, char** argv, Options& options) {
       return usageError("more than one script given");
     }
   }
-  if (options.script != nullptr && options.lines.count() > 0) {
+  options.argc = argc;
+  options.argv = argv;
+  if (options.script != nullptr && options.lineCount > 0) {
     return usageError("give either -e lines or a script, not both");
   }
   return -1;
@@ -147,9 +155,9 @@ int run(const Options& options) {
     scriptFile = OwnedFile(openForReading(options.script));
     if (!scriptFile) return failure("cannot read", options.script, strerror(errno));
   }
-  const char* source = options.lines.count() > 0 ? "-e"
-                       : fromScript              ? options.script
-                                                 : "standard input";
+  const char* source = options.lineCount > 0 ? "-e"
+                       : fromScript          ? options.script
+                                             : "standard input";
 
   HString error;
   const HString modulePath =
@@ -163,12 +171,15 @@ int run(const Options& options) {
   LineReader reader(fromScript ? fileno(scriptFile.get()) : 0);
   bool allOk = true;
   if (options.list) console.list();
-  if (options.list && options.lines.count() == 0 && options.script == nullptr) {
+  if (options.list && options.lineCount == 0 && options.script == nullptr) {
     // --list alone lists and ends.
-  } else if (options.lines.count() > 0) {
-    for (int i = 0; i < options.lines.count() && out.failure() == nullptr; ++i) {
-      const char* line = options.lines[i];
-      allOk = console.runLine(i + 1, line, strlen(line)) && allOk;
+  } else if (options.lineCount > 0) {
+    for (int i = 1, lineNumber = 1; i < options.argc && out.failure() == nullptr; ++i) {
+      if (strcmp(options.argv[i], "--module") == 0) ++i;  // its value is no line, even if "-e"
+      if (i + 1 < options.argc && strcmp(options.argv[i], "-e") == 0) {
+        const char* line = options.argv[++i];
+        allOk = console.runLine(lineNumber++, line, strlen(line)) && allOk;
+      }
     }
   } else {
     const bool interactive = !fromScript && standardInputIsTerminal();
@@ -201,6 +212,10 @@ char** utf8Arguments(int argc, TArray<HString>& texts, TArray<char*>& pointers) 
 }  // namespace
 
 int main(int argc, char** argv) {
+  if (!holdMemoryReserve()) {
+    fputs("tavix-host: out of memory\n", stderr);
+    return kUsageOrLoadError;
+  }
   try {
 #if defined(_WIN32)
     // Byte-for-byte the same output as on other systems: no CR before each LF.

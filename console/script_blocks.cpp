@@ -6,14 +6,13 @@ namespace {
 
 // Whether line, without the blanks at its end, is ``` followed by info.
 bool isFence(const char* line, size_t length, const char* info) {
-  while (length > 0 && (line[length - 1] == ' ' || line[length - 1] == '\t' ||
-                        line[length - 1] == '\r')) {
+  while (length > 0 &&
+         (line[length - 1] == ' ' || line[length - 1] == '\t' || line[length - 1] == '\r')) {
     --length;
   }
   const size_t infoLength = strlen(info);
   return length >= 3 && memcmp(line, "```", 3) == 0 &&
-         (infoLength == 0 || length == 3 + infoLength) &&
-         memcmp(line + 3, info, infoLength) == 0;
+         (infoLength == 0 || length == 3 + infoLength) && memcmp(line + 3, info, infoLength) == 0;
 }
 
 }  // namespace
