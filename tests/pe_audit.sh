@@ -19,7 +19,7 @@ readobj=${READOBJ:-llvm-readobj}
 
 # fails with what was looked for, when a pattern is not in the text.
 check() {  # WHAT PATTERN TEXT
-  if ! printf '%s\n' "$3" | grep -qE "$2"; then
+  if ! grep -qE "$2" <<<"$3"; then
     echo "$table audit failed for $module: $1"
     exit 1
   fi
@@ -39,7 +39,7 @@ if [ "$table" = shipping ]; then
   check "no PDB named without its folder" 'PDBFileName: [^/\\]+\.pdb$' "$debug"
   resources=$("$readobj" --coff-resources "$module")
   check "no version resource" 'Type: VERSIONINFO' "$resources"
-  if [ "${module##*.}" != exe ] && printf '%s\n' "$resources" | grep -q 'Type: MANIFEST'; then
+  if [ "${module##*.}" != exe ] && grep -q 'Type: MANIFEST' <<<"$resources"; then
     echo "shipping audit failed for $module: a manifest in a DLL"
     exit 1
   fi
@@ -49,7 +49,7 @@ fi
 
 if [ "$table" = thread-state ]; then
   check "thread-local storage" 'TLSTableSize: 0x0$' "$("$readobj" --file-headers "$module")"
-  if "$readobj" --coff-imports "$module" | grep -qE 'Symbol: (_Init_thread_|_tls_|__dyn_tls)'; then
+  if grep -qE 'Symbol: (_Init_thread_|_tls_|__dyn_tls)' <<<"$("$readobj" --coff-imports "$module")"; then
     echo "thread-state audit failed for $module: it imports thread-safe-static or TLS support"
     exit 1
   fi
@@ -70,7 +70,7 @@ if [ "$table" = exports ]; then
 else
   found=$("$readobj" --coff-imports "$module" | sed -n 's/^ *Name: \(.*\.dll\)$/\1/p' | sort -u)
   unexpected=$(printf '%s\n' "$found" | grep -viE '^(TavixCore\.dll|kernel32\.dll|api-ms-win-crt-[a-z]+-l1-1-0\.dll)$' || true)
-  if [ -n "$unexpected" ] || ! printf '%s\n' "$found" | grep -qx TavixCore.dll; then
+  if [ -n "$unexpected" ] || ! grep -qx TavixCore.dll <<<"$found"; then
     echo "import audit failed for $module; it imports:"
     printf '  %s\n' $found
     exit 1

@@ -11,7 +11,7 @@ trap 'rm -rf "$work"' EXIT
 cd "$work"
 failed=0
 expect() {  # WHAT PATTERN OUTPUT
-  if printf '%s\n' "$3" | grep -qE "$2"; then
+  if grep -qE "$2" <<<"$3"; then
     echo "ok: $1"
   else
     printf 'FAILED: %s\n  expected to match: %s\n  got: %s\n' "$1" "$2" "$3"
