@@ -175,8 +175,9 @@ int run(const Options& options) {
     // --list alone lists and ends.
   } else if (options.lineCount > 0) {
     for (int i = 1, lineNumber = 1; i < options.argc && out.failure() == nullptr; ++i) {
-      if (strcmp(options.argv[i], "--module") == 0) ++i;  // its value is no line, even if "-e"
-      if (i + 1 < options.argc && strcmp(options.argv[i], "-e") == 0) {
+      if (strcmp(options.argv[i], "--module") == 0) {
+        ++i;  // its value is no line, even if it reads "-e"
+      } else if (i + 1 < options.argc && strcmp(options.argv[i], "-e") == 0) {
         const char* line = options.argv[++i];
         allOk = console.runLine(lineNumber++, line, strlen(line)) && allOk;
       }

@@ -124,6 +124,8 @@ TEST(ConsoleTest, UsageAndLoadErrorsExitWithTwo) {
   EXPECT_EQ(runHost({"--module", "/nonexistent/x.hll", "-e", "x"}).all(),
             "2||tavix-host: cannot load /nonexistent/x.hll: No such file or directory\n");
   EXPECT_EQ(runHost({"--module", hostFolder() + "tavix-host", "-e", "x"}).status, 2);
+  EXPECT_EQ(runHost({"/nonexistent/x.tavix"}).all(),
+            "2||tavix-host: cannot read /nonexistent/x.tavix: No such file or directory\n");
   for (const std::vector<std::string>& args : {std::vector<std::string>{"--bogus"},
                                                {"-e"},
                                                {"--json", "--check"},
