@@ -1,14 +1,5 @@
 #include "listing.h"
 
-const IdentityField kIdentityFields[6] = {
-    {"maker", &HomCorePluginBase::getMakerName},
-    {"publisher", &HomCorePluginBase::getPublisherName},
-    {"buildDate", &HomCorePluginBase::getBuildDate},
-    {"version", &HomCorePluginBase::getVersionString},
-    {"name", &HomCorePluginBase::getPluginName},
-    {"release", &HomCorePluginBase::getReleaseString},
-};
-
 const char* typeName(Variable::VarType type) {
   switch (type) {
     case Variable::TypeInt:

@@ -11,7 +11,14 @@ struct IdentityField {
   const char* key;
   HString (HomCorePluginBase::*value)();
 };
-extern const IdentityField kIdentityFields[6];
+inline constexpr IdentityField kIdentityFields[] = {
+    {"maker", &HomCorePluginBase::getMakerName},
+    {"publisher", &HomCorePluginBase::getPublisherName},
+    {"buildDate", &HomCorePluginBase::getBuildDate},
+    {"version", &HomCorePluginBase::getVersionString},
+    {"name", &HomCorePluginBase::getPluginName},
+    {"release", &HomCorePluginBase::getReleaseString},
+};
 
 // "integer", "string", "array of strings" or "none".
 const char* typeName(Variable::VarType type);
