@@ -25,7 +25,7 @@ function(tavix_windows_binary target file_name description)
   set(rc ${CMAKE_CURRENT_BINARY_DIR}/${target}.rc)
   set(res ${CMAKE_CURRENT_BINARY_DIR}/${target}.res)
   configure_file(${CMAKE_CURRENT_FUNCTION_LIST_DIR}/version.rc.in ${rc} @ONLY)
-  add_custom_command(OUTPUT ${res} COMMAND ${TAVIX_RC} -no-preprocess -FO ${res} ${rc}
+  add_custom_command(OUTPUT ${res} COMMAND ${TAVIX_RC} -no-preprocess -FO ${res} -- ${rc}
                      DEPENDS ${rc} VERBATIM)
   set_source_files_properties(${res} PROPERTIES EXTERNAL_OBJECT TRUE GENERATED TRUE)
   target_sources(${target} PRIVATE ${res})
